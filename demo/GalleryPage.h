@@ -1,0 +1,30 @@
+// A page of the gallery: a child window that shows one family of controls.
+// Pages register themselves with GALLERY_PAGE; the gallery creates them in order.
+#pragma once
+
+#include <afxwin.h>
+
+class CGalleryPage : public CWnd
+{
+public:
+    // Text of the page's tab.
+    virtual LPCTSTR GetTitle() const = 0;
+    // Creates the page's controls; the page window exists and has its final size.
+    virtual void CreateControls() = 0;
+};
+
+typedef CGalleryPage* (*GalleryPageFactory)();
+
+struct GalleryPageEntry
+{
+    GalleryPageEntry(int order, GalleryPageFactory factory);
+    int order;
+    GalleryPageFactory factory;
+    GalleryPageEntry* next;
+};
+
+// Pages in ascending order of registration number.
+GalleryPageEntry* GetGalleryPages();
+
+#define GALLERY_PAGE(order, cls) \
+    static GalleryPageEntry _galleryPage_##cls(order, []() -> CGalleryPage* { return new cls; })

@@ -1,0 +1,345 @@
+// CDialog: modeless and modal dialogs from in-memory templates.
+// Covers:
+// - SubclassDlgItem on a control of a template; Default reaches the control
+// - DoModal: OnInitDialog runs, EndDialog from a posted message or a timer ends
+//   it with that result, the owner is disabled meanwhile and enabled after
+// - PreTranslateMessage order inside the modal loop: control, its parent, the
+//   dialog (whose IsDialogMessage then handles the key)
+// - temporary objects made inside the modal loop are freed when it goes idle;
+//   those made before it survive
+// - OnOK with DDX_Text: invalid input keeps the dialog open with a message box,
+//   valid input ends it with IDOK and the value
+// - EndDialog from OnInitDialog ends DoModal at once
+#include <afxwin.h>
+
+#include <gtest/gtest.h>
+
+#include "Input.h"
+#include "dlg_template_test.h"
+
+#include <string>
+
+using afx_test::DialogTemplate;
+
+namespace {
+
+const WORD kEditId = 1001;
+const UINT kEndMsg = WM_USER + 5;
+
+DialogTemplate MakeTemplate(DWORD style = WS_POPUP | WS_CAPTION | WS_SYSMENU)
+{
+    DialogTemplate tmpl(style, 160, 80, L"Test dialog");
+    tmpl.AddControl(DialogTemplate::Edit, WS_BORDER | WS_TABSTOP | ES_AUTOHSCROLL, 10, 10, 100, 14, kEditId, L"");
+    tmpl.AddControl(DialogTemplate::Button, BS_DEFPUSHBUTTON | WS_TABSTOP, 10, 40, 50, 14, IDOK, L"OK");
+    tmpl.AddControl(DialogTemplate::Button, BS_PUSHBUTTON | WS_TABSTOP, 70, 40, 50, 14, IDCANCEL, L"Cancel");
+    return tmpl;
+}
+
+class CUpperEdit : public CEdit
+{
+public:
+    afx_msg void OnChar(UINT nChar, UINT, UINT)
+    {
+        // the original procedure inserts the character it is given
+        const MSG* pMsg = GetCurrentMessage();
+        if (nChar >= 'a' && nChar <= 'z')
+            DefWindowProc(WM_CHAR, nChar - 'a' + 'A', pMsg->lParam);
+        else
+            Default();
+    }
+    DECLARE_MESSAGE_MAP()
+};
+
+BEGIN_MESSAGE_MAP(CUpperEdit, CEdit)
+    ON_WM_CHAR()
+END_MESSAGE_MAP()
+
+TEST(DlgModeless, SubclassDlgItemFromInMemoryTemplate)
+{
+    DialogTemplate tmpl = MakeTemplate();
+    CDialog dlg;
+    ASSERT_TRUE(dlg.CreateIndirect(tmpl.get()));
+    ASSERT_NE(nullptr, dlg.m_hWnd);
+    EXPECT_EQ(&dlg, CWnd::FromHandlePermanent(dlg.m_hWnd));
+
+    CUpperEdit edit;
+    ASSERT_TRUE(edit.SubclassDlgItem(kEditId, &dlg));
+    EXPECT_EQ(&edit, dlg.GetDlgItem(kEditId));
+    EXPECT_FALSE(CUpperEdit().SubclassDlgItem(4242, &dlg));
+    orvane_test::SendChars(edit.m_hWnd, L"ab1c");
+    CString text;
+    edit.GetWindowText(text);
+    EXPECT_STREQ(L"AB1C", (LPCTSTR)text);
+
+    // dialog units map to pixels through the dialog's font
+    CRect rect(0, 0, 4, 8);
+    dlg.MapDialogRect(&rect);
+    EXPECT_GT(rect.Width(), 0);
+    EXPECT_GT(rect.Height(), 0);
+
+    EXPECT_TRUE(dlg.DestroyWindow());
+    EXPECT_EQ(NULL, edit.m_hWnd);
+    EXPECT_EQ(NULL, dlg.m_hWnd);
+}
+
+/////////////////////////////////////////////////////////////////////////////
+
+class CTraceWnd : public CWnd
+{
+public:
+    std::string* m_pTrace = nullptr;
+    const char* m_pszName = "";
+    BOOL m_bEat = FALSE;
+    BOOL PreTranslateMessage(MSG* pMsg) override
+    {
+        if (pMsg->message == WM_KEYDOWN)
+            *m_pTrace += std::string(m_pszName) + ";";
+        return m_bEat;
+    }
+};
+
+class CTraceEdit : public CEdit
+{
+public:
+    std::string* m_pTrace = nullptr;
+    int m_nKeyDowns = 0;
+    BOOL PreTranslateMessage(MSG* pMsg) override
+    {
+        if (pMsg->message == WM_KEYDOWN)
+            *m_pTrace += "child;";
+        return FALSE;
+    }
+    afx_msg void OnKeyDown(UINT, UINT, UINT) { ++m_nKeyDowns; Default(); }
+    DECLARE_MESSAGE_MAP()
+};
+
+BEGIN_MESSAGE_MAP(CTraceEdit, CEdit)
+    ON_WM_KEYDOWN()
+END_MESSAGE_MAP()
+
+class CModalDlg : public CDialog
+{
+public:
+    std::string m_trace;
+    int m_nEndResult = 77;
+    UINT m_nTimerMs = 0;
+    BOOL m_bEndInInit = FALSE;
+    BOOL m_bPanel = FALSE;
+    BOOL m_bOwnerDisabledInLoop = FALSE;
+    HWND m_hWndOwnerSeen = NULL;
+    CTraceWnd m_panel;
+    CTraceEdit m_panelEdit;
+    // temporaries
+    HWND m_hWndTempInner = NULL;
+    HWND m_hWndTempOuter = NULL;
+    UINT m_nInnerFlagsAtTimer = 0xFFFF;
+    UINT m_nOuterFlagsAtTimer = 0xFFFF;
+
+    explicit CModalDlg(CWnd* pParent = NULL) : CDialog() { m_pParentWnd = pParent; }
+
+    BOOL OnInitDialog() override
+    {
+        CDialog::OnInitDialog();
+        m_hWndOwnerSeen = ::GetWindow(m_hWnd, GW_OWNER);
+        if (m_hWndOwnerSeen != NULL)
+            m_bOwnerDisabledInLoop = !::IsWindowEnabled(m_hWndOwnerSeen);
+        if (m_bEndInInit)
+        {
+            EndDialog(5);
+            return TRUE;
+        }
+        if (m_bPanel)
+        {
+            m_panel.m_pTrace = &m_trace;
+            m_panel.m_pszName = "parent";
+            m_panel.Create(NULL, L"", WS_VISIBLE, CRect(0, 0, 200, 60), this, 2000);
+            m_panelEdit.m_pTrace = &m_trace;
+            m_panelEdit.Create(WS_CHILD | WS_VISIBLE, CRect(0, 0, 100, 20), &m_panel, 2001);
+            m_panelEdit.PostMessage(WM_KEYDOWN, 'A', 1);
+        }
+        if (m_hWndTempInner != NULL)
+            CWnd::FromHandle(m_hWndTempInner)->m_nFlags = 0x4000;
+        if (m_nTimerMs != 0)
+            SetTimer(1, m_nTimerMs, NULL);
+        else
+            PostMessage(kEndMsg);
+        return TRUE;
+    }
+
+    BOOL PreTranslateMessage(MSG* pMsg) override
+    {
+        if (pMsg->message == WM_KEYDOWN)
+            m_trace += "top;";
+        return CDialog::PreTranslateMessage(pMsg);
+    }
+
+    afx_msg LRESULT OnEnd(WPARAM, LPARAM) { EndDialog(m_nEndResult); return 0; }
+    afx_msg void OnTimer(UINT_PTR)
+    {
+        KillTimer(1);
+        if (m_hWndTempInner != NULL)
+            m_nInnerFlagsAtTimer = CWnd::FromHandle(m_hWndTempInner)->m_nFlags;
+        if (m_hWndTempOuter != NULL)
+            m_nOuterFlagsAtTimer = CWnd::FromHandle(m_hWndTempOuter)->m_nFlags;
+        EndDialog(m_nEndResult);
+    }
+
+    DECLARE_MESSAGE_MAP()
+};
+
+BEGIN_MESSAGE_MAP(CModalDlg, CDialog)
+    ON_MESSAGE(kEndMsg, &CModalDlg::OnEnd)
+    ON_WM_TIMER()
+END_MESSAGE_MAP()
+
+struct ModalFixture : testing::Test
+{
+    DialogTemplate tmpl = MakeTemplate();
+    CWnd owner;
+
+    void SetUp() override
+    {
+        ASSERT_TRUE(owner.CreateEx(0, NULL, L"owner", WS_OVERLAPPEDWINDOW | WS_VISIBLE,
+            CRect(0, 0, 400, 300), NULL, 0));
+        owner.SetActiveWindow();
+    }
+    void TearDown() override
+    {
+        owner.DestroyWindow();
+        orvane_test::PumpUntilIdle(50);
+    }
+};
+
+using DlgModal = ModalFixture;
+
+TEST_F(DlgModal, EndDialogFromPostedMessageEndsTheLoopWithItsResult)
+{
+    CModalDlg dlg(&owner);
+    ASSERT_TRUE(dlg.InitModalIndirect(tmpl.get(), &owner));
+    EXPECT_EQ(77, dlg.DoModal());
+    EXPECT_EQ(NULL, dlg.m_hWnd);
+    EXPECT_EQ(owner.m_hWnd, dlg.m_hWndOwnerSeen);
+    EXPECT_TRUE(dlg.m_bOwnerDisabledInLoop);
+    EXPECT_TRUE(owner.IsWindowEnabled());
+}
+
+TEST_F(DlgModal, EndDialogFromTimerEndsTheLoop)
+{
+    CModalDlg dlg(&owner);
+    dlg.m_nTimerMs = 20;
+    dlg.m_nEndResult = IDCANCEL;
+    ASSERT_TRUE(dlg.InitModalIndirect(tmpl.get(), &owner));
+    EXPECT_EQ(IDCANCEL, dlg.DoModal());
+    EXPECT_TRUE(owner.IsWindowEnabled());
+}
+
+TEST_F(DlgModal, EndDialogInOnInitDialogEndsAtOnce)
+{
+    CModalDlg dlg(&owner);
+    dlg.m_bEndInInit = TRUE;
+    ASSERT_TRUE(dlg.InitModalIndirect(tmpl.get(), &owner));
+    EXPECT_EQ(5, dlg.DoModal());
+    EXPECT_EQ(NULL, dlg.m_hWnd);
+    EXPECT_TRUE(owner.IsWindowEnabled());
+}
+
+TEST_F(DlgModal, NoTemplateFails)
+{
+    CModalDlg dlg(&owner);
+    EXPECT_EQ(-1, dlg.DoModal());
+    EXPECT_TRUE(owner.IsWindowEnabled());
+    CDialog missing(31999u, &owner);
+    EXPECT_EQ(-1, missing.DoModal());
+}
+
+TEST_F(DlgModal, PreTranslateMessageWalksControlParentDialog)
+{
+    CModalDlg dlg(&owner);
+    dlg.m_bPanel = TRUE;
+    dlg.m_nTimerMs = 30;
+    ASSERT_TRUE(dlg.InitModalIndirect(tmpl.get(), &owner));
+    EXPECT_EQ(77, dlg.DoModal());
+    EXPECT_EQ("child;parent;top;", dlg.m_trace);
+    // the dialog manager dispatched the key after the walk
+    EXPECT_EQ(1, dlg.m_panelEdit.m_nKeyDowns);
+}
+
+TEST_F(DlgModal, TemporariesMadeInsideTheLoopAreFreedAtIdle)
+{
+    HWND hOuter = ::CreateWindowExW(0, L"STATIC", L"o", WS_POPUP, 0, 0, 5, 5, NULL, NULL, NULL, NULL);
+    HWND hInner = ::CreateWindowExW(0, L"STATIC", L"i", WS_POPUP, 0, 0, 5, 5, NULL, NULL, NULL, NULL);
+    CWnd* pOuter = CWnd::FromHandle(hOuter);   // held by this frame across DoModal
+    pOuter->m_nFlags = 0x4000;
+
+    CModalDlg dlg(&owner);
+    dlg.m_hWndTempInner = hInner;
+    dlg.m_hWndTempOuter = hOuter;
+    dlg.m_nTimerMs = 60;
+    ASSERT_TRUE(dlg.InitModalIndirect(tmpl.get(), &owner));
+    EXPECT_EQ(77, dlg.DoModal());
+    EXPECT_EQ(0u, dlg.m_nInnerFlagsAtTimer);        // freed and made anew
+    EXPECT_EQ(0x4000u, dlg.m_nOuterFlagsAtTimer);   // kept for this frame
+    EXPECT_EQ(0x4000u, pOuter->m_nFlags);
+    ::DestroyWindow(hOuter);
+    ::DestroyWindow(hInner);
+    CWnd::DeleteTempMap();
+}
+
+/////////////////////////////////////////////////////////////////////////////
+
+class CDataDlg : public CDialog
+{
+public:
+    int m_nValue = 12;
+    CString m_strTyped;
+    void DoDataExchange(CDataExchange* pDX) override
+    {
+        DDX_Text(pDX, kEditId, m_nValue);
+    }
+    BOOL OnInitDialog() override
+    {
+        BOOL bResult = CDialog::OnInitDialog();
+        GetDlgItemText(kEditId, m_strTyped);
+        // invalid text first: OK must keep the dialog open
+        SetDlgItemText(kEditId, L"12x");
+        PostMessage(WM_COMMAND, IDOK);
+        PostMessage(WM_USER + 6);
+        return bResult;
+    }
+    afx_msg LRESULT OnFix(WPARAM, LPARAM)
+    {
+        SetDlgItemText(kEditId, L" -345 ");
+        PostMessage(WM_COMMAND, IDOK);
+        return 0;
+    }
+    DECLARE_MESSAGE_MAP()
+};
+
+BEGIN_MESSAGE_MAP(CDataDlg, CDialog)
+    ON_MESSAGE(WM_USER + 6, &CDataDlg::OnFix)
+END_MESSAGE_MAP()
+
+TEST_F(DlgModal, OnOkValidatesWithDataExchange)
+{
+    std::wstring appName = AfxGetAppName();
+    orvane_test::DialogAnswerer answerer([&](const orvane_test::DialogAnswerer::Seen& seen) {
+        return seen.caption == appName ? IDOK : 0;
+    });
+    CDataDlg dlg;
+    ASSERT_TRUE(dlg.InitModalIndirect(tmpl.get(), &owner));
+    EXPECT_EQ(IDOK, dlg.DoModal());
+    EXPECT_STREQ(L"12", (LPCTSTR)dlg.m_strTyped);   // UpdateData(FALSE) in OnInitDialog
+    EXPECT_EQ(-345, dlg.m_nValue);
+    int nBoxes = 0;
+    for (const auto& seen : answerer.seen())
+    {
+        if (seen.caption == appName)
+        {
+            ++nBoxes;
+            EXPECT_EQ(L"Please enter an integer.", seen.text);
+        }
+    }
+    EXPECT_EQ(1, nBoxes);
+}
+
+} // namespace

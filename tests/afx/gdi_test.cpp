@@ -1,0 +1,395 @@
+// GDI wrappers: covers
+// - SelectObject returns the previously selected object (the owning C++ object, or
+//   a typed temporary wrapper) and restoring returns the one selected before
+// - every object type deletes its handle in the destructor; Attach over a held
+//   handle deletes the old one; temporary wrappers never delete their handle
+// - FromHandle: owner first, otherwise one typed temporary per handle until DeleteTempMap
+// - pixels: FillSolidRect, Draw3dRect edges, FillRect with a CBrush in a memory DC
+// - CFont::CreatePointFont height from the DC's resolution; GetTextExtent
+// - CRgn combination and hit tests
+// - CPaintDC validates the update region; CClientDC belongs to its window
+#include <gtest/gtest.h>
+#include <afxwin.h>
+
+// gtest would print a CRect through its LPRECT conversion, as an address.
+static void PrintTo(const CRect& rect, std::ostream* os)
+{
+    *os << "(" << rect.left << "," << rect.top << ")-(" << rect.right << "," << rect.bottom << ")";
+}
+
+namespace {
+
+// A memory DC with a colour bitmap selected, as a screen-compatible canvas.
+struct Canvas
+{
+    CDC dc;
+    CBitmap bitmap;
+    CBitmap* pOldBitmap;
+
+    Canvas(int cx, int cy) : pOldBitmap(NULL)
+    {
+        CClientDC screen(NULL);
+        EXPECT_TRUE(dc.CreateCompatibleDC(&screen));
+        EXPECT_TRUE(bitmap.CreateCompatibleBitmap(&screen, cx, cy));
+        pOldBitmap = dc.SelectObject(&bitmap);
+    }
+    ~Canvas()
+    {
+        dc.SelectObject(pOldBitmap);
+    }
+};
+
+} // namespace
+
+class GdiTest : public testing::Test
+{
+protected:
+    void TearDown() override
+    {
+        CGdiObject::DeleteTempMap();
+        CDC::DeleteTempMap();
+    }
+};
+
+TEST_F(GdiTest, SelectReturnsOldObjectAndRestores)
+{
+    Canvas canvas(8, 8);
+    CDC& dc = canvas.dc;
+    ASSERT_NE(nullptr, canvas.pOldBitmap);
+    EXPECT_TRUE(canvas.pOldBitmap->IsKindOf(RUNTIME_CLASS(CBitmap)));
+
+    CPen red(PS_SOLID, 1, RGB(255, 0, 0));
+    CPen blue(PS_SOLID, 1, RGB(0, 0, 255));
+    CPen* pStockPen = dc.SelectObject(&red);
+    ASSERT_NE(nullptr, pStockPen);
+    EXPECT_EQ((HGDIOBJ)::GetStockObject(BLACK_PEN), pStockPen->GetSafeHandle());
+    EXPECT_TRUE(pStockPen->IsKindOf(RUNTIME_CLASS(CPen)));
+    EXPECT_EQ(&red, dc.GetCurrentPen());
+    EXPECT_EQ(&red, dc.SelectObject(&blue)) << "the owning object comes back, not a wrapper";
+    EXPECT_EQ(&blue, dc.SelectObject(pStockPen));
+    EXPECT_EQ(pStockPen, dc.GetCurrentPen());
+
+    CBrush brush(RGB(1, 2, 3));
+    CBrush* pOldBrush = dc.SelectObject(&brush);
+    EXPECT_EQ((HGDIOBJ)::GetStockObject(WHITE_BRUSH), pOldBrush->GetSafeHandle());
+    EXPECT_EQ(&brush, dc.SelectObject(pOldBrush));
+
+    CFont font;
+    ASSERT_TRUE(font.CreatePointFont(100, L"Arial"));
+    CFont* pOldFont = dc.SelectObject(&font);
+    ASSERT_NE(nullptr, pOldFont);
+    EXPECT_EQ(&font, dc.GetCurrentFont());
+    EXPECT_EQ(&font, dc.SelectObject(pOldFont));
+
+    CGdiObject* pOld = dc.SelectStockObject(NULL_BRUSH);
+    EXPECT_EQ(pOldBrush, pOld) << "one temporary wrapper per handle";
+    dc.SelectObject(pOld);
+
+    CRgn rgn;
+    ASSERT_TRUE(rgn.CreateRectRgn(0, 0, 4, 4));
+    EXPECT_EQ(SIMPLEREGION, dc.SelectObject(&rgn));
+    CRect rcClip;
+    EXPECT_EQ(SIMPLEREGION, dc.GetClipBox(&rcClip));
+    EXPECT_EQ(CRect(0, 0, 4, 4), rcClip);
+
+    // Null objects change nothing.
+    EXPECT_EQ(nullptr, dc.SelectObject((CPen*)NULL));
+    EXPECT_EQ(GDI_ERROR, dc.SelectObject((CRgn*)NULL));
+    EXPECT_EQ(pStockPen, dc.GetCurrentPen());
+}
+
+TEST_F(GdiTest, DestructorsDeleteEveryObject)
+{
+    HGDIOBJ handles[8] = {};
+    HDC hdc = NULL;
+    {
+        CPen pen(PS_DASH, 1, RGB(1, 1, 1));
+        LOGBRUSH lb = { BS_SOLID, RGB(2, 2, 2), 0 };
+        CPen extPen(PS_GEOMETRIC | PS_SOLID, 3, &lb);
+        CBrush brush(RGB(3, 3, 3));
+        CBrush hatch(HS_CROSS, RGB(4, 4, 4));
+        CFont font;
+        ASSERT_TRUE(font.CreateFont(-12, 0, 0, 0, FW_BOLD, 0, 0, 0, DEFAULT_CHARSET, 0, 0, 0, 0, L"Arial"));
+        CBitmap bitmap;
+        ASSERT_TRUE(bitmap.CreateBitmap(8, 8, 1, 1, NULL));
+        CBrush pattern(&bitmap);
+        CRgn rgn;
+        POINT pts[] = { { 0, 0 }, { 10, 0 }, { 5, 8 } };
+        ASSERT_TRUE(rgn.CreatePolygonRgn(pts, 3, ALTERNATE));
+        CDC dc;
+        ASSERT_TRUE(dc.CreateCompatibleDC(NULL));
+
+        handles[0] = pen.m_hObject;
+        handles[1] = extPen.m_hObject;
+        handles[2] = brush.m_hObject;
+        handles[3] = hatch.m_hObject;
+        handles[4] = font.m_hObject;
+        handles[5] = bitmap.m_hObject;
+        handles[6] = pattern.m_hObject;
+        handles[7] = rgn.m_hObject;
+        hdc = dc.m_hDC;
+        const DWORD expected[8] = { OBJ_PEN, OBJ_EXTPEN, OBJ_BRUSH, OBJ_BRUSH, OBJ_FONT, OBJ_BITMAP,
+            OBJ_BRUSH, OBJ_REGION };
+        for (int i = 0; i < 8; i++)
+            EXPECT_EQ(expected[i], ::GetObjectType(handles[i])) << "object " << i;
+        EXPECT_EQ((DWORD)OBJ_MEMDC, ::GetObjectType(hdc));
+    }
+    for (int i = 0; i < 8; i++)
+        EXPECT_EQ(0u, ::GetObjectType(handles[i])) << "object " << i << " still exists";
+    EXPECT_EQ(0u, ::GetObjectType(hdc));
+}
+
+TEST_F(GdiTest, AttachOverHeldHandleDeletesIt)
+{
+    CBrush brush;
+    ASSERT_TRUE(brush.CreateSolidBrush(RGB(10, 10, 10)));
+    HGDIOBJ hFirst = brush.m_hObject;
+    ASSERT_TRUE(brush.CreateSolidBrush(RGB(20, 20, 20)));
+    HGDIOBJ hSecond = brush.m_hObject;
+    EXPECT_EQ(0u, ::GetObjectType(hFirst));
+    EXPECT_EQ((DWORD)OBJ_BRUSH, ::GetObjectType(hSecond));
+    EXPECT_EQ(&brush, CGdiObject::FromHandle(hSecond));
+
+    HGDIOBJ hDetached = brush.Detach();
+    EXPECT_EQ(hSecond, hDetached);
+    EXPECT_EQ(nullptr, brush.m_hObject);
+    EXPECT_FALSE(brush.DeleteObject());
+    EXPECT_NE(&brush, CGdiObject::FromHandle(hDetached)) << "a detached handle has no owner";
+    CGdiObject::DeleteTempMap();
+    EXPECT_EQ((DWORD)OBJ_BRUSH, ::GetObjectType(hDetached));
+    ::DeleteObject(hDetached);
+}
+
+TEST_F(GdiTest, TemporaryWrappersAreTypedSharedAndNeverDelete)
+{
+    HBRUSH hBrush = ::CreateSolidBrush(RGB(5, 6, 7));
+    HPEN hPen = ::CreatePen(PS_SOLID, 1, RGB(5, 6, 7));
+    HRGN hRgn = ::CreateRectRgn(0, 0, 1, 1);
+    CGdiObject* pBrush = CGdiObject::FromHandle(hBrush);
+    ASSERT_NE(nullptr, pBrush);
+    EXPECT_STREQ("CBrush", pBrush->GetRuntimeClass()->m_lpszClassName);
+    EXPECT_STREQ("CPen", CGdiObject::FromHandle(hPen)->GetRuntimeClass()->m_lpszClassName);
+    EXPECT_STREQ("CRgn", CGdiObject::FromHandle(hRgn)->GetRuntimeClass()->m_lpszClassName);
+    EXPECT_EQ(pBrush, CBrush::FromHandle(hBrush));
+    EXPECT_EQ(nullptr, CGdiObject::FromHandle(NULL));
+
+    CGdiObject::DeleteTempMap();
+    EXPECT_EQ((DWORD)OBJ_BRUSH, ::GetObjectType(hBrush));
+    EXPECT_EQ((DWORD)OBJ_PEN, ::GetObjectType(hPen));
+    EXPECT_EQ((DWORD)OBJ_REGION, ::GetObjectType(hRgn));
+
+    // A handle that gets an owner is answered by the owner.
+    CBrush owner;
+    CBrush* pTemp = CBrush::FromHandle(hBrush);
+    ASSERT_TRUE(owner.Attach(hBrush));
+    EXPECT_EQ(&owner, CBrush::FromHandle(hBrush));
+    EXPECT_EQ(hBrush, pTemp->m_hObject) << "the old wrapper stays usable until idle";
+    CGdiObject::DeleteTempMap();
+    EXPECT_EQ((DWORD)OBJ_BRUSH, ::GetObjectType(hBrush));
+
+    ::DeleteObject(hPen);
+    ::DeleteObject(hRgn);
+
+    HDC hdc = ::CreateCompatibleDC(NULL);
+    CDC* pDC = CDC::FromHandle(hdc);
+    ASSERT_NE(nullptr, pDC);
+    EXPECT_EQ(hdc, pDC->m_hDC);
+    EXPECT_EQ(hdc, pDC->m_hAttribDC);
+    EXPECT_EQ(pDC, CDC::FromHandle(hdc));
+    CDC::DeleteTempMap();
+    EXPECT_EQ((DWORD)OBJ_MEMDC, ::GetObjectType(hdc));
+    ::DeleteDC(hdc);
+}
+
+TEST_F(GdiTest, FillSolidRectAndDraw3dRectPixels)
+{
+    Canvas canvas(20, 20);
+    CDC& dc = canvas.dc;
+    const COLORREF back = RGB(10, 20, 30), light = RGB(250, 240, 230), dark = RGB(40, 50, 60);
+    dc.FillSolidRect(0, 0, 20, 20, back);
+    EXPECT_EQ(back, dc.GetPixel(0, 0));
+    EXPECT_EQ(back, dc.GetPixel(19, 19));
+    EXPECT_EQ(back, dc.GetBkColor()) << "the fill leaves the background colour set";
+
+    dc.Draw3dRect(CRect(2, 2, 12, 10), light, dark);
+    EXPECT_EQ(light, dc.GetPixel(2, 2));      // top-left corner
+    EXPECT_EQ(light, dc.GetPixel(10, 2));     // top edge up to right - 2
+    EXPECT_EQ(light, dc.GetPixel(2, 8));      // left edge down to bottom - 2
+    EXPECT_EQ(dark, dc.GetPixel(11, 2));      // right edge
+    EXPECT_EQ(dark, dc.GetPixel(11, 9));
+    EXPECT_EQ(dark, dc.GetPixel(2, 9));       // bottom edge
+    EXPECT_EQ(back, dc.GetPixel(5, 5));       // inside untouched
+    EXPECT_EQ(back, dc.GetPixel(12, 5));      // outside untouched
+    EXPECT_EQ(back, dc.GetPixel(5, 10));
+
+    CBrush brush(RGB(0, 128, 0));
+    dc.FillRect(CRect(14, 14, 18, 18), &brush);
+    EXPECT_EQ(RGB(0, 128, 0), dc.GetPixel(14, 14));
+    EXPECT_EQ(RGB(0, 128, 0), dc.GetPixel(17, 17));
+    EXPECT_EQ(back, dc.GetPixel(18, 18));
+
+    EXPECT_EQ(RGB(1, 2, 3), dc.SetPixel(1, 1, RGB(1, 2, 3)));   // returns the colour set
+    EXPECT_EQ(RGB(1, 2, 3), dc.GetPixel(CPoint(1, 1)));
+}
+
+TEST_F(GdiTest, PointFontFollowsTheDeviceResolution)
+{
+    CClientDC screen(NULL);
+    CFont font;
+    ASSERT_TRUE(font.CreatePointFont(120, L"Arial", &screen));
+    LOGFONT lf;
+    ASSERT_EQ((int)sizeof(LOGFONT), font.GetLogFont(&lf));
+    EXPECT_EQ(-::MulDiv(screen.GetDeviceCaps(LOGPIXELSY), 120, 720), lf.lfHeight);
+    EXPECT_STREQ(L"Arial", lf.lfFaceName);
+
+    CFont font2;
+    ASSERT_TRUE(font2.CreatePointFont(90, L"Arial"));
+    ASSERT_EQ((int)sizeof(LOGFONT), font2.GetLogFont(&lf));
+    EXPECT_EQ(-::MulDiv(screen.GetDeviceCaps(LOGPIXELSY), 90, 720), lf.lfHeight);
+
+    CFont* pOld = screen.SelectObject(&font);
+    CSize extent = screen.GetTextExtent(CString(L"Hello"));
+    SIZE expected = { 0, 0 };
+    ::GetTextExtentPoint32W(screen.m_hDC, L"Hello", 5, &expected);
+    EXPECT_EQ(expected.cx, extent.cx);
+    EXPECT_EQ(expected.cy, extent.cy);
+    EXPECT_EQ(expected.cx, screen.GetTextExtent(L"Hello", -1).cx);
+    TEXTMETRIC tm;
+    ASSERT_TRUE(screen.GetTextMetrics(&tm));
+    EXPECT_EQ(expected.cy, tm.tmHeight);
+    CString face;
+    screen.GetTextFace(face);
+    EXPECT_FALSE(face.IsEmpty());
+    screen.SelectObject(pOld);
+}
+
+TEST_F(GdiTest, RegionsCombineAndHitTest)
+{
+    CRgn a, b, both;
+    ASSERT_TRUE(a.CreateRectRgn(0, 0, 10, 10));
+    ASSERT_TRUE(b.CreateEllipticRgn(5, 5, 25, 25));
+    ASSERT_TRUE(both.CreateRectRgn(0, 0, 0, 0));
+    EXPECT_EQ(COMPLEXREGION, both.CombineRgn(&a, &b, RGN_OR));
+    EXPECT_TRUE(both.PtInRegion(1, 1));
+    EXPECT_TRUE(both.PtInRegion(CPoint(15, 15)));
+    EXPECT_FALSE(both.PtInRegion(24, 1));
+    CRect box, boxB;
+    both.GetRgnBox(&box);
+    b.GetRgnBox(&boxB);   // the platform decides the ellipse's last row and column
+    EXPECT_EQ(CRect(0, 0, 10, 10) | boxB, box);
+    EXPECT_EQ(COMPLEXREGION, both.CombineRgn(&a, &b, RGN_DIFF));
+    EXPECT_TRUE(both.PtInRegion(1, 1));
+    EXPECT_FALSE(both.PtInRegion(9, 9));
+    EXPECT_EQ(SIMPLEREGION, both.CopyRgn(&a));
+    EXPECT_TRUE(both.EqualRgn(&a));
+    both.OffsetRgn(100, 0);
+    EXPECT_FALSE(both.PtInRegion(1, 1));
+    EXPECT_TRUE(both.RectInRegion(CRect(100, 0, 101, 1)));
+}
+
+TEST_F(GdiTest, BitBltCopiesBetweenMemoryDCs)
+{
+    Canvas src(10, 10), dst(10, 10);
+    src.dc.FillSolidRect(0, 0, 10, 10, RGB(200, 100, 50));
+    dst.dc.FillSolidRect(0, 0, 10, 10, RGB(0, 0, 0));
+    ASSERT_TRUE(dst.dc.BitBlt(2, 2, 3, 3, &src.dc, 0, 0, SRCCOPY));
+    EXPECT_EQ(RGB(200, 100, 50), dst.dc.GetPixel(2, 2));
+    EXPECT_EQ(RGB(200, 100, 50), dst.dc.GetPixel(4, 4));
+    EXPECT_EQ(RGB(0, 0, 0), dst.dc.GetPixel(5, 5));
+    ASSERT_TRUE(dst.dc.PatBlt(0, 0, 1, 1, WHITENESS));
+    EXPECT_EQ(RGB(255, 255, 255), dst.dc.GetPixel(0, 0));
+
+    int nSaved = dst.dc.SaveDC();
+    EXPECT_NE(0, nSaved);
+    dst.dc.SetMapMode(MM_TWIPS);
+    dst.dc.SetTextColor(RGB(1, 2, 3));
+    EXPECT_TRUE(dst.dc.RestoreDC(nSaved));
+    EXPECT_EQ(MM_TEXT, dst.dc.GetMapMode());
+    EXPECT_NE(RGB(1, 2, 3), dst.dc.GetTextColor());
+}
+
+namespace {
+
+struct PaintProbe
+{
+    int nPaints = 0;
+    HDC hdcSeen = NULL;
+    BOOL bValidAfter = FALSE;
+};
+PaintProbe g_paint;
+
+LRESULT CALLBACK PaintWndProc(HWND hWnd, UINT msg, WPARAM wParam, LPARAM lParam)
+{
+    if (msg == WM_PAINT)
+    {
+        {
+            CPaintDC dc(CWnd::FromHandle(hWnd));
+            g_paint.nPaints++;
+            g_paint.hdcSeen = dc.m_ps.hdc;
+            EXPECT_EQ(dc.m_ps.hdc, dc.m_hDC);
+            dc.FillSolidRect(&dc.m_ps.rcPaint, RGB(0, 0, 255));
+        }
+        return 0;
+    }
+    return ::DefWindowProcW(hWnd, msg, wParam, lParam);
+}
+
+} // namespace
+
+TEST_F(GdiTest, PaintAndClientDCsOfAWindow)
+{
+    WNDCLASSW wc = {};
+    wc.lpfnWndProc = PaintWndProc;
+    wc.hInstance = ::GetModuleHandleW(NULL);
+    wc.lpszClassName = L"AfxGdiTestPaint";
+    ::RegisterClassW(&wc);
+    HWND hWnd = ::CreateWindowW(L"AfxGdiTestPaint", L"", WS_POPUP | WS_VISIBLE, 0, 0, 60, 40,
+        NULL, NULL, wc.hInstance, NULL);
+    ASSERT_NE(nullptr, hWnd);
+
+    g_paint = PaintProbe();
+    ::InvalidateRect(hWnd, NULL, TRUE);
+    ::UpdateWindow(hWnd);
+    EXPECT_EQ(1, g_paint.nPaints);
+    EXPECT_NE(nullptr, g_paint.hdcSeen);
+    RECT rcUpdate;
+    EXPECT_FALSE(::GetUpdateRect(hWnd, &rcUpdate, FALSE)) << "EndPaint validated the window";
+
+    {
+        CClientDC dc(CWnd::FromHandle(hWnd));
+        ASSERT_NE(nullptr, dc.m_hDC);
+        EXPECT_EQ(hWnd, dc.GetWindow()->GetSafeHwnd());
+        EXPECT_EQ(RGB(0, 0, 255), dc.GetPixel(5, 5));
+        CRect rcClip;
+        dc.GetClipBox(&rcClip);
+        EXPECT_EQ(CRect(0, 0, 60, 40), rcClip);
+    }
+    {
+        CWindowDC dc(CWnd::FromHandle(hWnd));
+        EXPECT_NE(nullptr, dc.m_hDC);
+    }
+    ::DestroyWindow(hWnd);
+    ::UnregisterClassW(L"AfxGdiTestPaint", wc.hInstance);
+}
+
+TEST_F(GdiTest, CreateAndDestroyManyTimesLeavesNothing)
+{
+    HGDIOBJ hLastPen = NULL, hLastBitmap = NULL;
+    HDC hLastDC = NULL;
+    for (int i = 0; i < 200; i++)
+    {
+        Canvas canvas(4, 4);
+        CPen pen(PS_SOLID, 1, RGB(i, 0, 0));
+        CPen* pOld = canvas.dc.SelectObject(&pen);
+        canvas.dc.MoveTo(0, 0);
+        canvas.dc.LineTo(3, 0);
+        canvas.dc.SelectObject(pOld);
+        hLastPen = pen.m_hObject;
+        hLastBitmap = canvas.bitmap.m_hObject;
+        hLastDC = canvas.dc.m_hDC;
+        CGdiObject::DeleteTempMap();
+    }
+    EXPECT_EQ(0u, ::GetObjectType(hLastPen));
+    EXPECT_EQ(0u, ::GetObjectType(hLastBitmap));
+    EXPECT_EQ(0u, ::GetObjectType(hLastDC));
+}

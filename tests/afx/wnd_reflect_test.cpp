@@ -1,0 +1,312 @@
+// Reflection of control notifications to the control's own object.
+// Covers:
+// - EN_CHANGE: ON_CONTROL_REFLECT_EX returning FALSE lets the parent's
+//   ON_EN_CHANGE run as well, TRUE stops it; ON_CONTROL_REFLECT always stops it;
+//   a control without a framework object notifies the parent directly
+// - WM_NOTIFY: ON_NOTIFY_REFLECT_EX with both results, the result value seen by
+//   the sender, ON_NOTIFY_RANGE at the parent
+// - WM_DRAWITEM of an owner-drawn button reaching CButton::DrawItem, and
+//   ON_WM_DRAWITEM_REFLECT in a plain CWnd child
+// - WM_CTLCOLOR*: ON_WM_CTLCOLOR_REFLECT supplies the brush; without a brush the
+//   parent's own processing runs
+// - UpdateData locks control notifications out of the dialog window
+#include <afxwin.h>
+
+#include <gtest/gtest.h>
+
+#include "Input.h"
+
+#include <string>
+
+namespace {
+
+const UINT kEditId = 100;
+const UINT kPlainEditId = 101;
+const UINT kChildId = 102;
+const int kCustomNotify = -1234;
+
+class CParentWnd : public CWnd
+{
+public:
+    std::string m_trace;
+    LRESULT m_lNotifyResult = 0;
+
+    afx_msg void OnEditChange() { m_trace += "P:change;"; }
+    afx_msg void OnPlainEditChange() { m_trace += "P:plain;"; }
+    afx_msg void OnChildNotify(UINT nID, NMHDR* pNMHDR, LRESULT* pResult)
+    {
+        m_trace += "P:notify" + std::to_string(nID) + ";";
+        (void)pNMHDR;
+        *pResult = m_lNotifyResult;
+    }
+
+    DECLARE_MESSAGE_MAP()
+};
+
+BEGIN_MESSAGE_MAP(CParentWnd, CWnd)
+    ON_EN_CHANGE(kEditId, &CParentWnd::OnEditChange)
+    ON_EN_CHANGE(kPlainEditId, &CParentWnd::OnPlainEditChange)
+    ON_NOTIFY_RANGE(kCustomNotify, kChildId, kChildId + 5, &CParentWnd::OnChildNotify)
+END_MESSAGE_MAP()
+
+class CReflectEdit : public CEdit
+{
+public:
+    std::string* m_pTrace = nullptr;
+    BOOL m_bStop = FALSE;
+
+    afx_msg BOOL OnChange() { *m_pTrace += "E:change;"; return m_bStop; }
+
+    DECLARE_MESSAGE_MAP()
+};
+
+BEGIN_MESSAGE_MAP(CReflectEdit, CEdit)
+    ON_CONTROL_REFLECT_EX(EN_CHANGE, &CReflectEdit::OnChange)
+END_MESSAGE_MAP()
+
+class CEatingEdit : public CEdit
+{
+public:
+    int m_nChanges = 0;
+    afx_msg void OnChange() { ++m_nChanges; }
+    DECLARE_MESSAGE_MAP()
+};
+
+BEGIN_MESSAGE_MAP(CEatingEdit, CEdit)
+    ON_CONTROL_REFLECT(EN_CHANGE, &CEatingEdit::OnChange)
+END_MESSAGE_MAP()
+
+struct ParentFixture : testing::Test
+{
+    CParentWnd parent;
+
+    void SetUp() override
+    {
+        ASSERT_TRUE(parent.CreateEx(0, NULL, L"parent", WS_POPUP | WS_VISIBLE, CRect(20, 20, 320, 220), NULL, 0));
+    }
+    void TearDown() override
+    {
+        parent.DestroyWindow();
+        orvane_test::PumpUntilIdle(50);
+    }
+};
+
+using WndReflect = ParentFixture;
+
+TEST_F(WndReflect, EnChangeReachesEditThenParentWhenNotStopped)
+{
+    CReflectEdit edit;
+    edit.m_pTrace = &parent.m_trace;
+    ASSERT_TRUE(edit.Create(WS_CHILD | WS_VISIBLE, CRect(0, 0, 100, 20), &parent, kEditId));
+
+    edit.SetWindowText(L"1");
+    EXPECT_EQ("E:change;P:change;", parent.m_trace);
+
+    parent.m_trace.clear();
+    edit.m_bStop = TRUE;
+    edit.SetWindowText(L"2");
+    EXPECT_EQ("E:change;", parent.m_trace);
+}
+
+TEST_F(WndReflect, PlainReflectHandlerAlwaysEatsTheNotification)
+{
+    CEatingEdit edit;
+    ASSERT_TRUE(edit.Create(WS_CHILD | WS_VISIBLE, CRect(0, 0, 100, 20), &parent, kEditId));
+    edit.SetWindowText(L"x");
+    orvane_test::SendChars(edit.m_hWnd, L"yz");
+    EXPECT_EQ(3, edit.m_nChanges);
+    EXPECT_EQ("", parent.m_trace);
+}
+
+TEST_F(WndReflect, ControlWithoutObjectNotifiesTheParentDirectly)
+{
+    HWND hEdit = ::CreateWindowExW(0, L"EDIT", L"", WS_CHILD | WS_VISIBLE, 0, 30, 100, 20,
+        parent.m_hWnd, (HMENU)(UINT_PTR)kPlainEditId, NULL, NULL);
+    ASSERT_NE(nullptr, hEdit);
+    ::SetWindowTextW(hEdit, L"a");
+    EXPECT_EQ("P:plain;", parent.m_trace);
+}
+
+class CNotifyChild : public CWnd
+{
+public:
+    std::string* m_pTrace = nullptr;
+    BOOL m_bStop = FALSE;
+
+    afx_msg BOOL OnCustom(NMHDR* pNMHDR, LRESULT* pResult)
+    {
+        *m_pTrace += "C:notify" + std::to_string((int)pNMHDR->code) + ";";
+        *pResult = 42;
+        return m_bStop;
+    }
+    DECLARE_MESSAGE_MAP()
+};
+
+BEGIN_MESSAGE_MAP(CNotifyChild, CWnd)
+    ON_NOTIFY_REFLECT_EX(kCustomNotify, &CNotifyChild::OnCustom)
+END_MESSAGE_MAP()
+
+TEST_F(WndReflect, NotifyReachesChildThenParentWhenNotStopped)
+{
+    CNotifyChild child;
+    child.m_pTrace = &parent.m_trace;
+    ASSERT_TRUE(child.Create(NULL, L"", WS_VISIBLE, CRect(0, 60, 50, 80), &parent, kChildId + 2));
+
+    NMHDR nmhdr = { child.m_hWnd, kChildId + 2, (UINT)kCustomNotify };
+    parent.m_lNotifyResult = 7;
+    LRESULT lResult = parent.SendMessage(WM_NOTIFY, nmhdr.idFrom, (LPARAM)&nmhdr);
+    EXPECT_EQ("C:notify-1234;P:notify104;", parent.m_trace);
+    EXPECT_EQ(7, lResult);  // the parent's handler wrote last
+
+    parent.m_trace.clear();
+    child.m_bStop = TRUE;
+    lResult = parent.SendMessage(WM_NOTIFY, nmhdr.idFrom, (LPARAM)&nmhdr);
+    EXPECT_EQ("C:notify-1234;", parent.m_trace);
+    EXPECT_EQ(42, lResult);
+
+    // Another code is not reflected; the parent's range does not cover it.
+    parent.m_trace.clear();
+    nmhdr.code = NM_CLICK;
+    EXPECT_EQ(0, parent.SendMessage(WM_NOTIFY, nmhdr.idFrom, (LPARAM)&nmhdr));
+    EXPECT_EQ("", parent.m_trace);
+}
+
+class COwnerDrawButton : public CButton
+{
+public:
+    int m_nDraws = 0;
+    UINT m_nLastAction = 0;
+    HWND m_hWndItem = NULL;
+    void DrawItem(LPDRAWITEMSTRUCT lpDIS) override
+    {
+        ++m_nDraws;
+        m_nLastAction = lpDIS->itemAction;
+        m_hWndItem = lpDIS->hwndItem;
+        ::FillRect(lpDIS->hDC, &lpDIS->rcItem, (HBRUSH)::GetStockObject(BLACK_BRUSH));
+    }
+};
+
+TEST_F(WndReflect, OwnerDrawButtonPaintsThroughDrawItem)
+{
+    COwnerDrawButton button;
+    ASSERT_TRUE(button.Create(L"b", WS_CHILD | WS_VISIBLE | BS_OWNERDRAW, CRect(10, 100, 60, 130), &parent, 103));
+    button.Invalidate();
+    button.UpdateWindow();
+    EXPECT_GE(button.m_nDraws, 1);
+    EXPECT_EQ(button.m_hWnd, button.m_hWndItem);
+    EXPECT_EQ((UINT)ODA_DRAWENTIRE, button.m_nLastAction);
+
+    // the parent returns TRUE for a handled WM_DRAWITEM
+    DRAWITEMSTRUCT dis = {};
+    dis.CtlType = ODT_BUTTON;
+    dis.CtlID = 103;
+    dis.itemAction = ODA_FOCUS;
+    dis.hwndItem = button.m_hWnd;
+    dis.hDC = ::GetDC(button.m_hWnd);
+    ::GetClientRect(button.m_hWnd, &dis.rcItem);
+    int nBefore = button.m_nDraws;
+    EXPECT_EQ(TRUE, parent.SendMessage(WM_DRAWITEM, 103, (LPARAM)&dis));
+    ::ReleaseDC(button.m_hWnd, dis.hDC);
+    EXPECT_EQ(nBefore + 1, button.m_nDraws);
+    EXPECT_EQ((UINT)ODA_FOCUS, button.m_nLastAction);
+}
+
+class CDrawReflectWnd : public CWnd
+{
+public:
+    int m_nDraws = 0;
+    afx_msg void DrawItem(LPDRAWITEMSTRUCT lpDIS) { ++m_nDraws; (void)lpDIS; }
+    DECLARE_MESSAGE_MAP()
+};
+
+BEGIN_MESSAGE_MAP(CDrawReflectWnd, CWnd)
+    ON_WM_DRAWITEM_REFLECT()
+END_MESSAGE_MAP()
+
+TEST_F(WndReflect, DrawItemReflectMacroReachesPlainWindow)
+{
+    CDrawReflectWnd child;
+    ASSERT_TRUE(child.Create(NULL, L"", WS_VISIBLE, CRect(0, 0, 20, 20), &parent, 104));
+    DRAWITEMSTRUCT dis = {};
+    dis.CtlType = ODT_STATIC;
+    dis.CtlID = 104;
+    dis.hwndItem = child.m_hWnd;
+    parent.SendMessage(WM_DRAWITEM, 104, (LPARAM)&dis);
+    EXPECT_EQ(1, child.m_nDraws);
+
+    // an item of another window is not drawn by this object
+    dis.hwndItem = parent.m_hWnd;
+    parent.SendMessage(WM_DRAWITEM, 104, (LPARAM)&dis);
+    EXPECT_EQ(1, child.m_nDraws);
+}
+
+class CColorStatic : public CStatic
+{
+public:
+    HBRUSH m_hBrush = NULL;
+    UINT m_nCtlColor = 0xFFFF;
+    afx_msg HBRUSH CtlColor(CDC* pDC, UINT nCtlColor)
+    {
+        m_nCtlColor = nCtlColor;
+        if (pDC != NULL && m_hBrush != NULL)
+            pDC->SetTextColor(RGB(255, 0, 0));
+        return m_hBrush;
+    }
+    DECLARE_MESSAGE_MAP()
+};
+
+BEGIN_MESSAGE_MAP(CColorStatic, CStatic)
+    ON_WM_CTLCOLOR_REFLECT()
+END_MESSAGE_MAP()
+
+TEST_F(WndReflect, CtlColorReflectSuppliesTheBrush)
+{
+    CColorStatic label;
+    ASSERT_TRUE(label.Create(L"text", WS_CHILD | WS_VISIBLE, CRect(0, 140, 80, 160), &parent, 105));
+    HBRUSH hBrush = ::CreateSolidBrush(RGB(1, 2, 3));
+    label.m_hBrush = hBrush;
+
+    HDC hDC = ::GetDC(label.m_hWnd);
+    LRESULT lResult = parent.SendMessage(WM_CTLCOLORSTATIC, (WPARAM)hDC, (LPARAM)label.m_hWnd);
+    EXPECT_EQ((LRESULT)hBrush, lResult);
+    EXPECT_EQ((UINT)CTLCOLOR_STATIC, label.m_nCtlColor);
+    EXPECT_EQ(RGB(255, 0, 0), ::GetTextColor(hDC));
+
+    // No brush from the control: the parent's default processing answers.
+    label.m_hBrush = NULL;
+    lResult = parent.SendMessage(WM_CTLCOLORSTATIC, (WPARAM)hDC, (LPARAM)label.m_hWnd);
+    EXPECT_EQ(::DefWindowProcW(parent.m_hWnd, WM_CTLCOLORSTATIC, (WPARAM)hDC, (LPARAM)label.m_hWnd), lResult);
+    ::ReleaseDC(label.m_hWnd, hDC);
+    ::DeleteObject(hBrush);
+}
+
+class CDataParent : public CParentWnd
+{
+public:
+    CString m_strValue;
+    void DoDataExchange(CDataExchange* pDX) override { DDX_Text(pDX, kEditId, m_strValue); }
+};
+
+TEST(WndReflectLockout, UpdateDataDoesNotRouteTheChangesItCauses)
+{
+    CDataParent parent;
+    ASSERT_TRUE(parent.CreateEx(0, NULL, L"data", WS_POPUP, CRect(0, 0, 200, 100), NULL, 0));
+    CReflectEdit edit;
+    edit.m_pTrace = &parent.m_trace;
+    ASSERT_TRUE(edit.Create(WS_CHILD | WS_VISIBLE, CRect(0, 0, 100, 20), &parent, kEditId));
+
+    parent.m_strValue = L"loaded";
+    EXPECT_TRUE(parent.UpdateData(FALSE));
+    EXPECT_EQ("", parent.m_trace);
+    CString text;
+    edit.GetWindowText(text);
+    EXPECT_STREQ(L"loaded", (LPCTSTR)text);
+
+    edit.SetWindowText(L"typed");   // outside UpdateData: routed again
+    EXPECT_EQ("E:change;P:change;", parent.m_trace);
+    EXPECT_TRUE(parent.UpdateData(TRUE));
+    EXPECT_STREQ(L"typed", (LPCTSTR)parent.m_strValue);
+    parent.DestroyWindow();
+}
+
+} // namespace

@@ -1,0 +1,93 @@
+// Input without a user: pumping with bounds, modifier keys, mouse messages in client
+// coordinates, and answering message boxes and modal dialogs from a hook.
+#pragma once
+
+#include <windows.h>
+
+#include <functional>
+#include <string>
+#include <vector>
+
+namespace orvane_test {
+
+// Dispatches everything queued for this thread until the queue stays empty, at most
+// maxMs milliseconds. Returns the number of messages dispatched.
+int PumpUntilIdle(DWORD maxMs = 200);
+
+// Pumps until pred() holds or timeoutMs elapses; returns pred().
+bool WaitFor(const std::function<bool()>& pred, DWORD timeoutMs = 2000);
+
+// Sets the thread's key state for the given virtual keys (VK_CONTROL, VK_SHIFT, VK_MENU
+// also set their left-hand variants) and restores the previous state on destruction.
+class KeyStateGuard
+{
+public:
+    KeyStateGuard(std::initializer_list<int> keysDown);
+    ~KeyStateGuard();
+    KeyStateGuard(const KeyStateGuard&) = delete;
+    KeyStateGuard& operator=(const KeyStateGuard&) = delete;
+
+private:
+    BYTE m_saved[256];
+};
+
+LPARAM PointParam(int x, int y);
+// Sends WM_KEYDOWN then WM_KEYUP with a plausible lParam.
+void SendKey(HWND hwnd, UINT vk);
+// Sends one WM_CHAR per character.
+void SendChars(HWND hwnd, const std::wstring& text);
+// Sends the button-down and button-up of a left click at client point (x, y).
+void SendClick(HWND hwnd, int x, int y, WPARAM keys = 0);
+
+// Answers message boxes and modal dialogs from a WH_CBT hook on this thread. Each
+// #32770 window activated for the first time is recorded with its caption and
+// message text (the static with id 0xFFFF) and answered by posting WM_COMMAND with
+// the button id the handler returns (0 leaves it alone, for the test to handle).
+class DialogAnswerer
+{
+public:
+    struct Seen
+    {
+        HWND hwnd;
+        std::wstring caption;
+        std::wstring text;
+    };
+    using Handler = std::function<int(const Seen&)>;
+
+    explicit DialogAnswerer(int button = IDOK);
+    explicit DialogAnswerer(Handler handler);
+    ~DialogAnswerer();
+    DialogAnswerer(const DialogAnswerer&) = delete;
+    DialogAnswerer& operator=(const DialogAnswerer&) = delete;
+
+    const std::vector<Seen>& seen() const { return m_seen; }
+    int count() const { return static_cast<int>(m_seen.size()); }
+    std::wstring lastText() const { return m_seen.empty() ? std::wstring() : m_seen.back().text; }
+    void clear() { m_seen.clear(); }
+
+private:
+    static LRESULT CALLBACK CbtProc(int code, WPARAM wParam, LPARAM lParam);
+    void OnActivate(HWND hwnd);
+
+    HHOOK m_hook = nullptr;
+    Handler m_handler;
+    std::vector<Seen> m_seen;
+    std::vector<HWND> m_answered;
+    DialogAnswerer* m_previous = nullptr;
+};
+
+// A visible top-level window that hosts controls under test (parent and notification
+// target); its procedure is DefWindowProc, spies attach to it.
+class HostWindow
+{
+public:
+    HostWindow(int width = 640, int height = 480, DWORD style = WS_OVERLAPPEDWINDOW | WS_VISIBLE | WS_CLIPCHILDREN);
+    ~HostWindow();
+    HWND hwnd() const { return m_hwnd; }
+    operator HWND() const { return m_hwnd; }
+
+private:
+    HWND m_hwnd;
+};
+
+} // namespace orvane_test

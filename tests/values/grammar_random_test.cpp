@@ -1,0 +1,274 @@
+// Generated texts against a reference reading of the grammar:
+//  - a few thousand random texts (fixed seed) built from the grammar's pieces and mutated;
+//  - KvtParseLong and KvtParseDouble never crash and agree with the reference on result code,
+//    error position and value;
+//  - the reference is written differently from the module: regular expressions decide whether a
+//    text is a number, the error position is the first character after which no completion
+//    ("" or "1") can make the text a number, and the value comes from the C runtime.
+#include <gtest/gtest.h>
+
+#include <cerrno>
+#include <cmath>
+#include <cstdint>
+#include <cstdlib>
+#include <cstring>
+#include <map>
+#include <random>
+#include <regex>
+#include <string>
+
+#include "NumberText.h"
+
+namespace
+{
+
+struct Reference
+{
+    KVTEnumConvertType code;
+    int errorPos;
+    long longValue;
+    double doubleValue;
+};
+
+bool IsBlank(wchar_t ch) { return ch == L' ' || ch == L'\t'; }
+
+std::string Narrow(const std::wstring& text)
+{
+    std::string narrow;
+    for (wchar_t ch : text)
+        narrow += ch < 0x80 ? char(ch) : '?';
+    return narrow;
+}
+
+// Common frame: blanks around the core, words, then viability of every prefix of the core.
+Reference ReferenceFrame(const std::wstring& text, const std::wregex& grammar, bool exponentRule,
+                         std::wstring& core, int& offset, bool& complete)
+{
+    Reference ref = { KVT_CONVERT_OK, 0, 0, 0.0 };
+    size_t first = 0, last = text.size();
+    while (first < last && IsBlank(text[first]))
+        ++first;
+    while (last > first && IsBlank(text[last - 1]))
+        --last;
+    core = text.substr(first, last - first);
+    offset = int(first);
+    complete = false;
+    static const std::wregex words(L"[+-]?(nan|inf|infinity)", std::regex::icase);
+    if (core.empty() || std::regex_match(core, words))
+    {
+        ref.code = KVT_CONVERT_NOT_A_NUMBER;
+        return ref;
+    }
+    if (std::regex_match(core, grammar))
+    {
+        complete = true;
+        return ref;
+    }
+    for (size_t n = 1; n <= core.size(); ++n)
+    {
+        std::wstring prefix = core.substr(0, n);
+        if (!std::regex_match(prefix, grammar) && !std::regex_match(prefix + L"1", grammar))
+        {
+            ref.code = KVT_CONVERT_SYNTAX_ERROR;
+            ref.errorPos = offset + int(n) - 1;
+            return ref;
+        }
+    }
+    // Every prefix can still become a number: something is missing at the end.
+    size_t letter = core.find_first_of(L"eE");
+    if (exponentRule && letter != std::wstring::npos)
+    {
+        ref.code = KVT_CONVERT_SYNTAX_ERROR;
+        ref.errorPos = offset + int(letter);
+    }
+    else
+        ref.code = KVT_CONVERT_NOT_A_NUMBER;
+    return ref;
+}
+
+Reference ReferenceLong(const std::wstring& text)
+{
+    static const std::wregex grammar(L"[+-]?(0[bB][01]+|0[xX][0-9a-fA-F]+|[0-9]+)");
+    std::wstring core;
+    int offset;
+    bool complete;
+    Reference ref = ReferenceFrame(text, grammar, false, core, offset, complete);
+    if (!complete)
+        return ref;
+
+    bool negative = core[0] == L'-';
+    bool sign = core[0] == L'-' || core[0] == L'+';
+    std::string digits = Narrow(core.substr(sign ? 1 : 0));
+    int base = 10;
+    if (digits.size() > 1 && digits[0] == '0' && (digits[1] == 'b' || digits[1] == 'B'))
+        base = 2;
+    if (digits.size() > 1 && digits[0] == '0' && (digits[1] == 'x' || digits[1] == 'X'))
+        base = 16;
+    if (base != 10)
+        digits = digits.substr(2);
+    errno = 0;
+    unsigned long long magnitude = std::strtoull(digits.c_str(), nullptr, base);
+    bool huge = errno == ERANGE;
+    if (base != 10 && !sign)
+    {
+        if (huge || magnitude > 0xFFFFFFFFull)
+            ref.code = KVT_CONVERT_OVERFLOW;
+        else
+            ref.longValue = long(int32_t(uint32_t(magnitude)));
+    }
+    else if (negative)
+    {
+        if (huge || magnitude > 2147483648ull)
+            ref.code = KVT_CONVERT_UNDERFLOW;
+        else
+            ref.longValue = long(-int64_t(magnitude));
+    }
+    else
+    {
+        if (huge || magnitude > 2147483647ull)
+            ref.code = KVT_CONVERT_OVERFLOW;
+        else
+            ref.longValue = long(magnitude);
+    }
+    return ref;
+}
+
+Reference ReferenceDouble(const std::wstring& text)
+{
+    static const std::wregex grammar(L"[+-]?([0-9]+(\\.[0-9]*)?|\\.[0-9]+)([eE][+-]?[0-9]+)?");
+    std::wstring core;
+    int offset;
+    bool complete;
+    Reference ref = ReferenceFrame(text, grammar, true, core, offset, complete);
+    if (!complete)
+        return ref;
+
+    std::string narrow = Narrow(core);
+    double value = std::strtod(narrow.c_str(), nullptr);
+    size_t exponent = narrow.find_first_of("eE");
+    bool nonZeroDigit = narrow.substr(0, exponent).find_first_of("123456789") != std::string::npos;
+    if (std::isinf(value))
+        ref.code = value < 0 ? KVT_CONVERT_UNDERFLOW : KVT_CONVERT_OVERFLOW;
+    else if (value == 0.0 && nonZeroDigit)
+        ref.code = KVT_CONVERT_PRECISION_LOSS;
+    else
+        ref.doubleValue = value;
+    return ref;
+}
+
+// Texts made of the grammar's pieces, then sometimes mutated by one character.
+std::wstring RandomText(std::mt19937& random)
+{
+    auto pick = [&random](const std::wstring& set) {
+        return set[std::uniform_int_distribution<size_t>(0, set.size() - 1)(random)];
+    };
+    auto chance = [&random](int percent) { return std::uniform_int_distribution<int>(0, 99)(random) < percent; };
+    auto count = [&random](int most) { return std::uniform_int_distribution<int>(0, most)(random); };
+
+    std::wstring text;
+    if (chance(15))
+    {
+        for (int n = count(10); n > 0; --n)
+            text += pick(L"0123456789+-.eEbBxXaAfF #$ \tni,g");
+        return text;
+    }
+    if (chance(10))
+        text += pick(L" \t");
+    if (chance(40))
+        text += pick(L"+-");
+    if (chance(5))
+        text += pick(L"nN");
+    int kind = count(2);
+    if (kind == 0)
+    {
+        for (int n = count(14); n > 0; --n)
+            text += pick(L"0123456789");
+        if (chance(40))
+        {
+            text += L'.';
+            for (int n = count(6); n > 0; --n)
+                text += pick(L"0123456789");
+        }
+        if (chance(35))
+        {
+            text += pick(L"eE");
+            if (chance(50))
+                text += pick(L"+-");
+            for (int n = count(4); n > 0; --n)
+                text += pick(L"0123456789");
+        }
+    }
+    else
+    {
+        text += L'0';
+        text += kind == 1 ? pick(L"bB") : pick(L"xX");
+        const wchar_t* digits = kind == 1 ? L"01" : L"0123456789abcdefABCDEF";
+        for (int n = count(kind == 1 ? 36 : 10); n > 0; --n)
+            text += pick(digits);
+    }
+    if (chance(10))
+        text += pick(L" \t");
+    if (chance(30) && !text.empty())
+    {
+        size_t at = std::uniform_int_distribution<size_t>(0, text.size() - 1)(random);
+        switch (count(2))
+        {
+        case 0: text.erase(at, 1); break;
+        case 1: text.insert(text.begin() + long(at), pick(L"0123456789+-.eEbxX g#")); break;
+        default: text[at] = pick(L"0123456789+-.eEbxX g#"); break;
+        }
+    }
+    return text;
+}
+
+TEST(GrammarRandom, LongAgreesWithReference)
+{
+    std::mt19937 random(12345);
+    std::map<int, int> seen;
+    for (int i = 0; i < 4000; ++i)
+    {
+        std::wstring text = RandomText(random);
+        Reference ref = ReferenceLong(text);
+        long value = 0x5A5A;
+        int errorPos = -1;
+        KVTEnumConvertType code = KvtParseLong(text.c_str(), int(text.size()), value, errorPos);
+        ASSERT_EQ(ref.code, code) << testing::PrintToString(text);
+        ASSERT_EQ(ref.errorPos, errorPos) << testing::PrintToString(text);
+        ASSERT_EQ(code == KVT_CONVERT_OK ? ref.longValue : 0x5A5A, value) << testing::PrintToString(text);
+        ++seen[code];
+    }
+    // The generator must reach every code the grammar gives for long.
+    for (int code : { 0, -3, -4, -5, -7 })
+        EXPECT_GE(seen[code], 40) << "code " << code;
+}
+
+TEST(GrammarRandom, DoubleAgreesWithReference)
+{
+    std::mt19937 random(54321);
+    std::map<int, int> seen;
+    for (int i = 0; i < 4000; ++i)
+    {
+        std::wstring text = RandomText(random);
+        // Exponents large enough to leave the type are spliced in now and then.
+        if (i % 5 == 0)
+            text += i % 2 ? L"e400" : L"e-400";
+        Reference ref = ReferenceDouble(text);
+        double value = 0.5;
+        int errorPos = -1;
+        KVTEnumConvertType code = KvtParseDouble(text.c_str(), int(text.size()), value, errorPos);
+        ASSERT_EQ(ref.code, code) << testing::PrintToString(text);
+        ASSERT_EQ(ref.errorPos, errorPos) << testing::PrintToString(text);
+        if (code == KVT_CONVERT_OK)
+        {
+            ASSERT_EQ(ref.doubleValue, value) << testing::PrintToString(text);
+            ASSERT_EQ(std::signbit(ref.doubleValue), std::signbit(value)) << testing::PrintToString(text);
+        }
+        else
+            ASSERT_EQ(0.5, value) << testing::PrintToString(text);
+        ++seen[code];
+    }
+    for (int code : { 0, -3, -4, -5, -6, -7 })
+        EXPECT_GE(seen[code], 20) << "code " << code;
+}
+
+} // namespace

@@ -1,0 +1,550 @@
+// The classes of the value-types module:
+//  - KVXString: GetAs and GetBase on the object (the texts the edits meet), Format, the grammar
+//    characters, IsFmtType, CString behaviour kept;
+//  - KVXVariant: COleVariant equality, copies that own their text, conversions (empty -> 0,
+//    rounding, overflow, text through the grammar, by-reference values), failures leave the
+//    out value alone;
+//  - KVXRange: membership at both ends included and excluded for long and double, the in-range
+//    ends (next integer, next double), reversed ends, empty and incomparable ranges, Adjust.
+#include <gtest/gtest.h>
+
+#include <cfloat>
+#include <climits>
+#include <cstdint>
+#include <cmath>
+#include <string>
+
+#include "KVXRange.h"
+#include "KVXString.h"
+#include "KVXVariant.h"
+
+namespace
+{
+
+std::wstring Text(const CString& s)
+{
+    return std::wstring(static_cast<LPCTSTR>(s), size_t(s.GetLength()));
+}
+
+/////////////////////////////////////////////////////////////////////////////
+// KVXString
+
+TEST(KVXStringGetAs, RoadOfOneEvent)
+{
+    KVXString text(L"0b102");
+    long value = 99;
+    int errorPos = -1;
+    EXPECT_EQ(KVT_CONVERT_SYNTAX_ERROR, text.GetAs(value, errorPos));
+    EXPECT_EQ(4, errorPos);
+    EXPECT_EQ(2, text.GetBase());
+    EXPECT_EQ(99, value);
+
+    text = L"0b10";  // the "2" deleted
+    EXPECT_EQ(KVT_CONVERT_OK, text.GetAs(value, errorPos));
+    EXPECT_EQ(2, value);
+    EXPECT_EQ(0, errorPos);
+}
+
+TEST(KVXStringGetAs, LongRangeEnds)
+{
+    long value = 0;
+    int errorPos = -1;
+    EXPECT_EQ(KVT_CONVERT_OVERFLOW, KVXString(L"2147483648").GetAs(value, errorPos));
+    EXPECT_EQ(KVT_CONVERT_UNDERFLOW, KVXString(L"-2147483649").GetAs(value, errorPos));
+    EXPECT_EQ(KVT_CONVERT_OK, KVXString(L"0x1F").GetAs(value, errorPos));
+    EXPECT_EQ(31, value);
+    EXPECT_EQ(KVT_CONVERT_OK, KVXString(L"0b101").GetAs(value, errorPos));
+    EXPECT_EQ(5, value);
+    EXPECT_EQ(KVT_CONVERT_NOT_A_NUMBER, KVXString(L"-").GetAs(value, errorPos));
+}
+
+TEST(KVXStringGetAs, DoubleTexts)
+{
+    double value = 0.0;
+    int errorPos = -1;
+    EXPECT_EQ(KVT_CONVERT_OK, KVXString(L"1e301").GetAs(value, errorPos));
+    EXPECT_EQ(1e301, value);
+    EXPECT_EQ(KVT_CONVERT_OVERFLOW, KVXString(L"1e309").GetAs(value, errorPos));
+    EXPECT_EQ(KVT_CONVERT_UNDERFLOW, KVXString(L"-1e309").GetAs(value, errorPos));
+    EXPECT_EQ(KVT_CONVERT_SYNTAX_ERROR, KVXString(L"12,5").GetAs(value, errorPos));
+    EXPECT_EQ(2, errorPos);
+    EXPECT_EQ(KVT_CONVERT_SYNTAX_ERROR, KVXString(L"e").GetAs(value, errorPos));
+    EXPECT_EQ(0, errorPos);
+    EXPECT_EQ(KVT_CONVERT_NOT_A_NUMBER, KVXString(L".").GetAs(value, errorPos));
+}
+
+TEST(KVXStringGetAs, EmbeddedNulIsAnOffendingCharacter)
+{
+    KVXString text(L"12\0" L"3", 4);
+    ASSERT_EQ(4, text.GetLength());
+    long value = 0;
+    int errorPos = -1;
+    EXPECT_EQ(KVT_CONVERT_SYNTAX_ERROR, text.GetAs(value, errorPos));
+    EXPECT_EQ(2, errorPos);
+}
+
+TEST(KVXStringFormat, PrintfStyle)
+{
+    KVXString text;
+    text.Format(L"%ld", -2147483647L - 1);
+    EXPECT_EQ(L"-2147483648", Text(text));
+    text.Format(L"%X", 255);
+    EXPECT_EQ(L"FF", Text(text));
+    text.Format(L"%.16g", 12.5);
+    EXPECT_EQ(L"12.5", Text(text));
+    text.Format(L"%s|%d", L"ab", 7);
+    EXPECT_EQ(L"ab|7", Text(text));
+    text.Format(static_cast<LPCTSTR>(NULL));
+    EXPECT_EQ(L"", Text(text));
+}
+
+TEST(KVXStringCharacters, GrammarLetters)
+{
+    EXPECT_EQ(L'E', KVXString::GetUpperEngDeli());
+    EXPECT_EQ(L'e', KVXString::GetLowerEngDeli());
+    EXPECT_EQ(L'B', KVXString::GetUpperBinary());
+    EXPECT_EQ(L'b', KVXString::GetLowerBinary());
+    EXPECT_EQ(L'r', KVXString::GetRealFlagFloat());
+    EXPECT_EQ(L'R', KVXString::GetRealFlagDouble());
+}
+
+class FormatTypeProbe : public KVXString
+{
+public:
+    BOOL Probe(WCHAR ch) const { return IsFmtType(ch); }
+};
+
+TEST(KVXStringCharacters, IsFmtType)
+{
+    FormatTypeProbe probe;
+    const std::wstring listed = L"%BCEGTXbcdefgiopstux";
+    for (WCHAR ch = 1; ch < 128; ++ch)
+        EXPECT_EQ(listed.find(ch) != std::wstring::npos ? TRUE : FALSE, probe.Probe(ch)) << "character " << char(ch);
+}
+
+TEST(KVXStringBasics, BehavesAsCString)
+{
+    static_assert(sizeof(KVXString) == sizeof(CString), "KVXString adds no data");
+    CString plain(L"abc");
+    KVXString copy(plain);
+    EXPECT_EQ(L"abc", Text(copy));
+    KVXString other = copy;
+    other += L"d";
+    EXPECT_EQ(L"abc", Text(copy));
+    EXPECT_EQ(L"abcd", Text(other));
+    other = plain;
+    EXPECT_EQ(L"abc", Text(other));
+    other = "narrow";
+    EXPECT_EQ(L"narrow", Text(other));
+    KVXString repeated(L'x', 3);
+    EXPECT_EQ(L"xxx", Text(repeated));
+}
+
+/////////////////////////////////////////////////////////////////////////////
+// KVXVariant
+
+TEST(KVXVariantEquality, AsCOleVariant)
+{
+    EXPECT_EQ(KVXVariant(), KVXVariant());
+    EXPECT_EQ(KVXVariant(5L), KVXVariant(5L));
+    EXPECT_NE(KVXVariant(5L), KVXVariant(6L));
+    EXPECT_NE(KVXVariant(1L), KVXVariant(1.0)) << "type counts";
+    EXPECT_NE(KVXVariant(), KVXVariant(0L)) << "empty is not zero";
+    EXPECT_EQ(KVXVariant(2.5), KVXVariant(2.5));
+    EXPECT_NE(KVXVariant(NAN), KVXVariant(NAN));
+    EXPECT_EQ(KVXVariant(KVXString(L"abc")), KVXVariant(KVXString(L"abc")));
+    EXPECT_NE(KVXVariant(KVXString(L"abc")), KVXVariant(KVXString(L"abd")));
+    EXPECT_NE(KVXVariant(KVXString(L"ab")), KVXVariant(KVXString(L"abc")));
+    EXPECT_EQ(KVXVariant(KVXString(L"")), KVXVariant(KVXString(L"")));
+    EXPECT_FALSE(KVXVariant(3L) != KVXVariant(3L));
+}
+
+TEST(KVXVariantEquality, RawVariants)
+{
+    VARIANT a, b;
+    VariantInit(&a);
+    VariantInit(&b);
+    a.vt = b.vt = VT_NULL;
+    EXPECT_TRUE(KvtVariantEqual(a, b));
+    a.vt = b.vt = VT_BOOL;
+    a.boolVal = VARIANT_TRUE;
+    b.boolVal = VARIANT_FALSE;
+    EXPECT_FALSE(KvtVariantEqual(a, b));
+    a.vt = b.vt = VT_CY;
+    a.cyVal.int64 = b.cyVal.int64 = 12345;
+    EXPECT_TRUE(KvtVariantEqual(a, b));
+    a.vt = b.vt = VT_I2;
+    a.iVal = 7;
+    b.iVal = 7;
+    EXPECT_TRUE(KvtVariantEqual(a, b));
+    b.vt = VT_I4;
+    b.lVal = 7;
+    EXPECT_FALSE(KvtVariantEqual(a, b));
+}
+
+TEST(KVXVariantLifetime, CopiesOwnTheirText)
+{
+    KVXVariant original(KVXString(L"first"));
+    KVXVariant copy(original);
+    original = KVXString(L"second");
+    KVXString text;
+    ASSERT_EQ(KVT_VARIANT_OK, copy.GetAs(text));
+    EXPECT_EQ(L"first", Text(text));
+    ASSERT_EQ(KVT_VARIANT_OK, original.GetAs(text));
+    EXPECT_EQ(L"second", Text(text));
+
+    KVXVariant assigned;
+    assigned = copy;
+    EXPECT_EQ(copy, assigned);
+    EXPECT_NE(copy.GetVariant().bstrVal, assigned.GetVariant().bstrVal) << "deep copy";
+
+    const KVXVariant& alias = assigned;
+    assigned = alias;  // self-assignment keeps the value
+    ASSERT_EQ(VT_BSTR, assigned.GetType());
+    ASSERT_EQ(KVT_VARIANT_OK, assigned.GetAs(text));
+    EXPECT_EQ(L"first", Text(text));
+
+    assigned = 4;
+    EXPECT_EQ(VT_I4, assigned.GetType());
+    assigned = 2.0;
+    EXPECT_EQ(VT_R8, assigned.GetType());
+    assigned.Clear();
+    EXPECT_EQ(VT_EMPTY, assigned.GetType());
+}
+
+TEST(KVXVariantConversion, EmptyConvertsToZero)
+{
+    KVXVariant empty;
+    long lValue = 99;
+    double dValue = 99.0;
+    KVXString text(L"x");
+    EXPECT_EQ(KVT_VARIANT_OK, empty.GetAs(lValue, 1));
+    EXPECT_EQ(0, lValue);
+    EXPECT_EQ(KVT_VARIANT_OK, empty.GetAs(dValue));
+    EXPECT_EQ(0.0, dValue);
+    EXPECT_EQ(KVT_VARIANT_OK, empty.GetAs(text));
+    EXPECT_EQ(L"", Text(text));
+}
+
+struct ToLongCase
+{
+    const char* name;
+    KVXVariant value;
+    KVTEnumVariantError result;
+    long expected;
+};
+
+void PrintTo(const ToLongCase& c, std::ostream* os) { *os << c.name; }
+
+std::string ToLongName(const testing::TestParamInfo<ToLongCase>& info) { return info.param.name; }
+
+VARIANT MakeVariant(VARTYPE vt, LONGLONG bits)
+{
+    VARIANT var;
+    VariantInit(&var);
+    var.vt = vt;
+    var.llVal = bits;
+    return var;
+}
+
+VARIANT MakeBool(bool value)
+{
+    VARIANT var;
+    VariantInit(&var);
+    var.vt = VT_BOOL;
+    var.boolVal = value ? VARIANT_TRUE : VARIANT_FALSE;
+    return var;
+}
+
+const ToLongCase kToLongCases[] = {
+    { "Long", KVXVariant(-42L), KVT_VARIANT_OK, -42 },
+    { "WholeDouble", KVXVariant(7.0), KVT_VARIANT_OK, 7 },
+    { "HalfRoundsToEvenDown", KVXVariant(2.5), KVT_VARIANT_OK, 2 },
+    { "HalfRoundsToEvenUp", KVXVariant(3.5), KVT_VARIANT_OK, 4 },
+    { "NegativeHalf", KVXVariant(-2.5), KVT_VARIANT_OK, -2 },
+    { "DoubleAtMin", KVXVariant(-2147483648.0), KVT_VARIANT_OK, LONG_MIN },
+    { "DoubleAboveMax", KVXVariant(2147483648.0), KVT_VARIANT_OVERFLOW, 0 },
+    { "DoubleHuge", KVXVariant(1e300), KVT_VARIANT_OVERFLOW, 0 },
+    { "DoubleNan", KVXVariant(NAN), KVT_VARIANT_NOT_A_NUMBER, 0 },
+    { "TextHex", KVXVariant(KVXString(L"0x1F")), KVT_VARIANT_OK, 31 },
+    { "TextBlanks", KVXVariant(KVXString(L" -12 ")), KVT_VARIANT_OK, -12 },
+    { "TextFraction", KVXVariant(KVXString(L"12.5")), KVT_VARIANT_NOT_A_NUMBER, 0 },
+    { "TextWord", KVXVariant(KVXString(L"abc")), KVT_VARIANT_NOT_A_NUMBER, 0 },
+    { "TextOverflow", KVXVariant(KVXString(L"2147483648")), KVT_VARIANT_OVERFLOW, 0 },
+    { "TextEmpty", KVXVariant(KVXString(L"")), KVT_VARIANT_NOT_A_NUMBER, 0 },
+    { "Short", KVXVariant(MakeVariant(VT_I2, 300)), KVT_VARIANT_OK, 300 },
+    { "Bool", KVXVariant(MakeBool(true)), KVT_VARIANT_OK, -1 },
+    { "Null", KVXVariant(MakeVariant(VT_NULL, 0)), KVT_VARIANT_TYPE_MISMATCH, 0 },
+    { "UnsignedTooBig", KVXVariant(MakeVariant(VT_UI4, 0xFFFFFFFF)), KVT_VARIANT_OVERFLOW, 0 },
+    { "UnsignedFits", KVXVariant(MakeVariant(VT_UI4, 0x7FFFFFFF)), KVT_VARIANT_OK, LONG_MAX },
+    { "Int64Fits", KVXVariant(MakeVariant(VT_I8, -5)), KVT_VARIANT_OK, -5 },
+    { "Int64TooBig", KVXVariant(MakeVariant(VT_I8, 1LL << 40)), KVT_VARIANT_OVERFLOW, 0 },
+    { "Int64TooSmall", KVXVariant(MakeVariant(VT_I8, -(1LL << 31) - 1)), KVT_VARIANT_OVERFLOW, 0 },
+    { "Unsigned64Huge", KVXVariant(MakeVariant(VT_UI8, -1)), KVT_VARIANT_OVERFLOW, 0 },
+};
+
+class VariantToLong : public testing::TestWithParam<ToLongCase> {};
+
+TEST_P(VariantToLong, Converts)
+{
+    const ToLongCase& c = GetParam();
+    long value = 12345;
+    EXPECT_EQ(c.result, c.value.GetAs(value, 1));
+    EXPECT_EQ(c.result == KVT_VARIANT_OK ? c.expected : 12345, value);
+}
+
+INSTANTIATE_TEST_SUITE_P(Table, VariantToLong, testing::ValuesIn(kToLongCases), ToLongName);
+
+TEST(KVXVariantConversion, ToDouble)
+{
+    double value = 0.0;
+    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(-3L).GetAs(value));
+    EXPECT_EQ(-3.0, value);
+    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(0.1).GetAs(value));
+    EXPECT_EQ(0.1, value);
+    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(KVXString(L"1.5e3")).GetAs(value));
+    EXPECT_EQ(1500.0, value);
+    value = 7.0;
+    EXPECT_EQ(KVT_VARIANT_OVERFLOW, KVXVariant(KVXString(L"1e309")).GetAs(value));
+    EXPECT_EQ(KVT_VARIANT_OVERFLOW, KVXVariant(KVXString(L"1e-400")).GetAs(value));
+    EXPECT_EQ(KVT_VARIANT_NOT_A_NUMBER, KVXVariant(KVXString(L"1,5")).GetAs(value));
+    EXPECT_EQ(KVT_VARIANT_TYPE_MISMATCH, KVXVariant(MakeVariant(VT_NULL, 0)).GetAs(value));
+    EXPECT_EQ(7.0, value);
+    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(MakeVariant(VT_I2, 300)).GetAs(value));
+    EXPECT_EQ(300.0, value);
+    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(MakeVariant(VT_UI4, 0xFFFFFFFF)).GetAs(value));
+    EXPECT_EQ(4294967295.0, value);
+    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(MakeVariant(VT_UI8, -1)).GetAs(value));
+    EXPECT_EQ(18446744073709551616.0, value);
+}
+
+TEST(KVXVariantConversion, ToText)
+{
+    KVXString text;
+    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(-42L).GetAs(text));
+    EXPECT_EQ(L"-42", Text(text));
+    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(0.1).GetAs(text));
+    EXPECT_EQ(L"0.1", Text(text));
+    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(1e300).GetAs(text));
+    EXPECT_EQ(L"1e+300", Text(text));
+    VARIANT single;
+    VariantInit(&single);
+    single.vt = VT_R4;
+    single.fltVal = 0.1f;
+    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(single).GetAs(text));
+    EXPECT_EQ(L"0.1", Text(text));
+    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(MakeVariant(VT_I2, -7)).GetAs(text));
+    EXPECT_EQ(L"-7", Text(text));
+    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(MakeVariant(VT_UI4, 0xFFFFFFFF)).GetAs(text));
+    EXPECT_EQ(L"4294967295", Text(text));
+    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(MakeVariant(VT_I8, INT64_MIN)).GetAs(text));
+    EXPECT_EQ(L"-9223372036854775808", Text(text));
+    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(MakeVariant(VT_UI8, -1)).GetAs(text));
+    EXPECT_EQ(L"18446744073709551615", Text(text));
+    text = L"kept";
+    EXPECT_EQ(KVT_VARIANT_TYPE_MISMATCH, KVXVariant(MakeVariant(VT_NULL, 0)).GetAs(text));
+    EXPECT_EQ(L"kept", Text(text));
+}
+
+TEST(KVXVariantConversion, ByReferenceValues)
+{
+    LONG target = 1234;
+    VARIANT byRef;
+    VariantInit(&byRef);
+    byRef.vt = VT_I4 | VT_BYREF;
+    byRef.plVal = &target;
+    KVXVariant var(byRef);
+    long lValue = 0;
+    EXPECT_EQ(KVT_VARIANT_OK, var.GetAs(lValue));
+    EXPECT_EQ(1234, lValue);
+    KVXString text;
+    EXPECT_EQ(KVT_VARIANT_OK, var.GetAs(text));
+    EXPECT_EQ(L"1234", Text(text));
+    EXPECT_EQ(KVXVariant(byRef), var) << "the same reference";
+}
+
+/////////////////////////////////////////////////////////////////////////////
+// KVXRange
+
+KVXRange MakeRange(const KVXVariant& minimum, const KVXVariant& maximum, bool minInclude, bool maxInclude)
+{
+    KVXRange range;
+    range.Empty(minimum);
+    range.Adjust(maximum);
+    range.SetMinimumInclude(minInclude);
+    range.SetMaximumInclude(maxInclude);
+    return range;
+}
+
+struct MembershipCase
+{
+    const char* name;
+    KVXVariant minimum, maximum;
+    bool minInclude, maxInclude;
+    KVXVariant value;
+    bool inside;
+};
+
+void PrintTo(const MembershipCase& c, std::ostream* os) { *os << c.name; }
+
+std::string MembershipName(const testing::TestParamInfo<MembershipCase>& info) { return info.param.name; }
+
+const double kNextAboveOne = std::nextafter(1.0, 2.0);
+const double kNextBelowTen = std::nextafter(10.0, 0.0);
+
+const MembershipCase kMembershipCases[] = {
+    { "LongMinIncluded", 1L, 10L, true, true, 1L, true },
+    { "LongMaxIncluded", 1L, 10L, true, true, 10L, true },
+    { "LongBelow", 1L, 10L, true, true, 0L, false },
+    { "LongAbove", 1L, 10L, true, true, 11L, false },
+    { "LongMinExcluded", 1L, 10L, false, true, 1L, false },
+    { "LongNextToMinExcluded", 1L, 10L, false, true, 2L, true },
+    { "LongMaxExcluded", 1L, 10L, true, false, 10L, false },
+    { "LongNextToMaxExcluded", 1L, 10L, true, false, 9L, true },
+    { "LongFullRangeMin", LONG_MIN, LONG_MAX, true, true, LONG_MIN, true },
+    { "LongFullRangeMax", LONG_MIN, LONG_MAX, true, true, LONG_MAX, true },
+    { "LongRangeDoubleInside", 1L, 10L, false, false, 1.5, true },
+    { "LongRangeDoubleJustAbove", 1L, 10L, true, true, 10.000001, false },
+    { "LongRangeEmptyValueIsZero", -1L, 1L, true, true, KVXVariant(), true },
+    { "LongRangeText", 1L, 10L, true, true, KVXString(L"5"), true },
+    { "LongRangeNotANumber", 1L, 10L, true, true, KVXString(L"x"), false },
+    { "DoubleMinIncluded", 1.0, 10.0, true, true, 1.0, true },
+    { "DoubleMaxIncluded", 1.0, 10.0, true, true, 10.0, true },
+    { "DoubleMinExcluded", 1.0, 10.0, false, true, 1.0, false },
+    { "DoubleNextAboveExcludedMin", 1.0, 10.0, false, true, kNextAboveOne, true },
+    { "DoubleMaxExcluded", 1.0, 10.0, true, false, 10.0, false },
+    { "DoubleNextBelowExcludedMax", 1.0, 10.0, true, false, kNextBelowTen, true },
+    { "DoubleBelow", 1.0, 10.0, true, true, 0.999, false },
+    { "DoubleLongValue", 1.0, 10.0, true, true, 10L, true },
+    { "DoubleNan", 1.0, 10.0, true, true, NAN, false },
+    { "DoubleEditDefault", -1e300, 1e300, true, true, 1e301, false },
+    { "DoubleEditDefaultInside", -1e300, 1e300, true, true, -1e300, true },
+    { "ReversedEnds", 10L, 1L, true, true, 5L, true },
+    { "ReversedEndsOutside", 10L, 1L, true, true, 11L, false },
+    { "NanEndContainsNothing", NAN, 10.0, true, true, 5.0, false },
+    { "TextEndThatIsNoNumber", KVXString(L"abc"), 10L, true, true, 5L, false },
+    { "PointRangeExcluded", 5L, 5L, false, true, 5L, false },
+};
+
+class RangeMembership : public testing::TestWithParam<MembershipCase> {};
+
+TEST_P(RangeMembership, IsInRange)
+{
+    const MembershipCase& c = GetParam();
+    KVXRange range = MakeRange(c.minimum, c.maximum, c.minInclude, c.maxInclude);
+    EXPECT_EQ(c.inside, range.IsInRange(c.value));
+}
+
+INSTANTIATE_TEST_SUITE_P(Table, RangeMembership, testing::ValuesIn(kMembershipCases), MembershipName);
+
+struct InRangeCase
+{
+    const char* name;
+    KVXVariant minimum, maximum;
+    bool minInclude, maxInclude;
+    KVXVariant lowest, highest;
+    bool anyInside;  // false: no value lies in the range, the ends come back as set
+};
+
+void PrintTo(const InRangeCase& c, std::ostream* os) { *os << c.name; }
+
+std::string InRangeName(const testing::TestParamInfo<InRangeCase>& info) { return info.param.name; }
+
+const InRangeCase kInRangeCases[] = {
+    { "LongIncluded", 1L, 10L, true, true, 1L, 10L, true },
+    { "LongExcluded", 1L, 10L, false, false, 2L, 9L, true },
+    { "LongFullRangeExcluded", LONG_MIN, LONG_MAX, false, false, LONG_MIN + 1, LONG_MAX - 1, true },
+    { "LongReversed", 10L, 1L, true, false, 1L, 9L, true },
+    { "LongSingleValue", 5L, 5L, true, true, 5L, 5L, true },
+    { "LongNothingInside", 5L, 6L, false, false, 5L, 6L, false },
+    { "LongNothingInsideAtTop", LONG_MAX, LONG_MAX, false, true, LONG_MAX, LONG_MAX, false },
+    { "DoubleIncluded", 0.0, 1.0, true, true, 0.0, 1.0, true },
+    { "DoubleExcluded", 1.0, 10.0, false, false, kNextAboveOne, kNextBelowTen, true },
+    { "DoubleExcludedZero", 0.0, 1.0, false, true, std::nextafter(0.0, 1.0), 1.0, true },
+    { "DoubleExcludedLargest", -DBL_MAX, DBL_MAX, false, false, std::nextafter(-DBL_MAX, 0.0), std::nextafter(DBL_MAX, 0.0), true },
+    { "DoubleNothingInside", 1.0, kNextAboveOne, false, false, 1.0, kNextAboveOne, false },
+    { "MixedEndsCompareAsDouble", 1L, 2.5, false, true, kNextAboveOne, 2.5, true },
+    { "NanEnd", NAN, 1.0, true, true, NAN, 1.0, false },
+};
+
+class RangeEnds : public testing::TestWithParam<InRangeCase> {};
+
+TEST_P(RangeEnds, InRangeValues)
+{
+    const InRangeCase& c = GetParam();
+    KVXRange range = MakeRange(c.minimum, c.maximum, c.minInclude, c.maxInclude);
+    KVXVariant lowest = range.GetMinimumInRange();
+    KVXVariant highest = range.GetMaximumInRange();
+    double lowestValue = 0.0, highestValue = 0.0, expectedLow = 0.0, expectedHigh = 0.0;
+    lowest.GetAs(lowestValue);
+    highest.GetAs(highestValue);
+    c.lowest.GetAs(expectedLow);
+    c.highest.GetAs(expectedHigh);
+    if (std::isnan(expectedLow))
+        EXPECT_TRUE(std::isnan(lowestValue)) << lowestValue;
+    else
+        EXPECT_EQ(expectedLow, lowestValue);
+    EXPECT_EQ(expectedHigh, highestValue);
+    EXPECT_EQ(c.lowest.GetType(), lowest.GetType());
+    EXPECT_EQ(c.highest.GetType(), highest.GetType());
+    EXPECT_EQ(c.anyInside, range.IsInRange(lowest));
+    EXPECT_EQ(c.anyInside, range.IsInRange(highest));
+}
+
+INSTANTIATE_TEST_SUITE_P(Table, RangeEnds, testing::ValuesIn(kInRangeCases), InRangeName);
+
+TEST(KVXRangeBuilding, EmptyThenAdjust)
+{
+    KVXRange range;
+    EXPECT_TRUE(range.IsInRange(KVXVariant(0L))) << "a new range is [0, 0]";
+    EXPECT_FALSE(range.IsInRange(KVXVariant(1L)));
+    EXPECT_TRUE(range.GetMinimumInclude());
+    EXPECT_TRUE(range.GetMaximumInclude());
+
+    range.Empty(KVXVariant(5L));
+    EXPECT_EQ(KVXVariant(5L), range.GetMinimum());
+    EXPECT_EQ(KVXVariant(5L), range.GetMaximum());
+    EXPECT_EQ(0, range.Adjust(KVXVariant(5L)));
+    EXPECT_EQ(2, range.Adjust(KVXVariant(9L)));
+    EXPECT_EQ(1, range.Adjust(KVXVariant(-3L)));
+    EXPECT_EQ(0, range.Adjust(KVXVariant(4L)));
+    EXPECT_EQ(KVXVariant(-3L), range.GetMinimum());
+    EXPECT_EQ(KVXVariant(9L), range.GetMaximum());
+
+    range.SetMinimumInclude(false);
+    range.Empty(KVXVariant(1.5));
+    EXPECT_FALSE(range.GetMinimumInclude()) << "Empty keeps the flags";
+    EXPECT_EQ(KVXVariant(1.5), range.GetMinimum());
+}
+
+TEST(KVXRangeBuilding, NotANumberContainsNothingUntilEmpty)
+{
+    KVXRange range;
+    range.Empty(KVXVariant(1L));
+    EXPECT_EQ(2, range.Adjust(KVXVariant(NAN)));
+    EXPECT_FALSE(range.IsInRange(KVXVariant(1L)));
+    EXPECT_EQ(2, range.Adjust(KVXVariant(5L)));
+    EXPECT_TRUE(range.IsInRange(KVXVariant(3L))) << "a number replaces the bad maximum";
+    range.Empty(KVXVariant(KVXString(L"x")));
+    EXPECT_FALSE(range.IsInRange(KVXVariant(0L)));
+    range.Empty(KVXVariant(0L));
+    EXPECT_TRUE(range.IsInRange(KVXVariant(0L)));
+}
+
+TEST(KVXRangeBuilding, CopyIsIndependent)
+{
+    KVXRange range = MakeRange(1L, 10L, true, false);
+    KVXRange copy(range);
+    range.Empty(KVXVariant(100L));
+    range.SetMaximumInclude(true);
+    EXPECT_TRUE(copy.IsInRange(KVXVariant(9L)));
+    EXPECT_FALSE(copy.IsInRange(KVXVariant(10L)));
+    EXPECT_FALSE(copy.GetMaximumInclude());
+    KVXRange assigned;
+    assigned = copy;
+    EXPECT_EQ(KVXVariant(1L), assigned.GetMinimum());
+    EXPECT_EQ(KVXVariant(10L), assigned.GetMaximum());
+    EXPECT_EQ(KVXVariant(9L), assigned.GetMaximumInRange());
+}
+
+} // namespace
