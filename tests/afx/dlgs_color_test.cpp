@@ -1,0 +1,228 @@
+// CColorDialog (afxdlgs.h):
+//  - construction: the CHOOSECOLOR record MFC fills (size, hook, flags, RGB init only for
+//    a non-black colour, the shared custom colours);
+//  - DoModal answered OK with a colour typed into the dialog, and cancelled;
+//  - the dialog window is attached to the object while it runs: OnInitDialog of a derived
+//    class runs once with the window, OnOK is routed through the object, and the object
+//    lets go of the window afterwards;
+//  - SetCurrentColor while running, OnColorOK keeping the dialog open.
+#include <afxwin.h>
+#include <afxdlgs.h>
+
+#include <gtest/gtest.h>
+
+#include <commctrl.h>
+
+#include <functional>
+#include <vector>
+
+namespace {
+
+// Runs one step per timer tick against the active dialog of this thread, while any
+// modal loop runs; steps return false to be retried. Cancels everything after 5 s.
+class DialogSteps
+{
+public:
+    using Step = std::function<bool(HWND)>;
+    explicit DialogSteps(std::vector<Step> steps) : m_steps(std::move(steps)), m_start(::GetTickCount())
+    {
+        s_current = this;
+        m_timer = ::SetTimer(NULL, 0, 15, Tick);
+    }
+    ~DialogSteps()
+    {
+        ::KillTimer(NULL, m_timer);
+        s_current = nullptr;
+    }
+    bool finished() const { return m_next == m_steps.size(); }
+
+private:
+    static void CALLBACK Tick(HWND, UINT, UINT_PTR, DWORD)
+    {
+        DialogSteps* self = s_current;
+        if (self == nullptr || self->m_busy || self->finished())
+            return;
+        self->m_busy = true;
+        HWND hActive = ::GetActiveWindow();
+        wchar_t cls[16] = {};
+        ::GetClassNameW(hActive, cls, 16);
+        if (::GetTickCount() - self->m_start > 5000)
+        {
+            ::PostMessage(hActive, WM_COMMAND, IDCANCEL, 0);
+            self->m_next = self->m_steps.size() + 1;
+        }
+        else if (lstrcmpW(cls, L"#32770") == 0 && ::IsWindowVisible(hActive) && self->m_steps[self->m_next](hActive))
+        {
+            ++self->m_next;
+        }
+        self->m_busy = false;
+    }
+
+    static DialogSteps* s_current;
+    std::vector<Step> m_steps;
+    size_t m_next = 0;
+    DWORD m_start;
+    UINT_PTR m_timer = 0;
+    bool m_busy = false;
+};
+
+DialogSteps* DialogSteps::s_current = nullptr;
+
+bool TypeColourAndOk(HWND hDlg, int r, int g, int b)
+{
+    ::SetDlgItemInt(hDlg, 706, r, FALSE);
+    ::SetDlgItemInt(hDlg, 707, g, FALSE);
+    ::SetDlgItemInt(hDlg, 708, b, FALSE);
+    ::PostMessage(hDlg, WM_COMMAND, IDOK, 0);
+    return true;
+}
+
+TEST(CColorDialogTest, ConstructionFillsTheRecord)
+{
+    CColorDialog black;
+    EXPECT_EQ(sizeof(CHOOSECOLOR), black.m_cc.lStructSize);
+    EXPECT_EQ(static_cast<DWORD>(CC_ENABLEHOOK), black.m_cc.Flags);
+    EXPECT_NE(nullptr, black.m_cc.lpfnHook);
+    EXPECT_EQ(0u, black.m_cc.rgbResult);
+    EXPECT_EQ(CColorDialog::GetSavedCustomColors(), black.m_cc.lpCustColors);
+
+    CColorDialog red(RGB(255, 0, 0), CC_FULLOPEN);
+    EXPECT_EQ(static_cast<DWORD>(CC_ENABLEHOOK | CC_FULLOPEN | CC_RGBINIT), red.m_cc.Flags);
+    EXPECT_EQ(RGB(255, 0, 0), red.m_cc.rgbResult);
+    EXPECT_EQ(RGB(255, 0, 0), red.GetColor());
+    EXPECT_TRUE(red.IsKindOf(RUNTIME_CLASS(CColorDialog)));
+    EXPECT_TRUE(red.IsKindOf(RUNTIME_CLASS(CDialog)));
+
+    COLORREF* pCustom = CColorDialog::GetSavedCustomColors();
+    ASSERT_NE(nullptr, pCustom);
+    EXPECT_EQ(pCustom, CColorDialog::GetSavedCustomColors());
+}
+
+TEST(CColorDialogTest, OkReturnsTheTypedColour)
+{
+    CColorDialog dlg(RGB(1, 2, 3), CC_FULLOPEN);
+    DialogSteps steps({ [](HWND h) { return TypeColourAndOk(h, 10, 20, 30); } });
+    EXPECT_EQ(IDOK, dlg.DoModal());
+    EXPECT_TRUE(steps.finished());
+    EXPECT_EQ(RGB(10, 20, 30), dlg.GetColor());
+    EXPECT_EQ(nullptr, dlg.m_hWnd);
+}
+
+TEST(CColorDialogTest, CancelReturnsIdCancelAndKeepsTheColour)
+{
+    CColorDialog dlg(RGB(1, 2, 3));
+    DialogSteps steps({ [](HWND h) {
+        ::PostMessage(h, WM_COMMAND, IDCANCEL, 0);
+        return true;
+    } });
+    EXPECT_EQ(IDCANCEL, dlg.DoModal());
+    EXPECT_TRUE(steps.finished());
+    EXPECT_EQ(RGB(1, 2, 3), dlg.GetColor());
+}
+
+// A derived dialog that records what reaches the object.
+class CRecordingColorDialog : public CColorDialog
+{
+public:
+    CRecordingColorDialog() : CColorDialog(0, CC_FULLOPEN) {}
+
+    virtual BOOL OnInitDialog()
+    {
+        ++m_nInit;
+        m_hWndAtInit = m_hWnd;
+        m_bAttachedAtInit = CWnd::FromHandlePermanent(m_hWnd) == this;
+        CColorDialog::OnInitDialog();
+        if (m_clrSetAtInit != CLR_INVALID)
+            SetCurrentColor(m_clrSetAtInit);
+        return TRUE;
+    }
+
+    virtual void OnOK()
+    {
+        ++m_nOk;
+        CColorDialog::OnOK();
+    }
+
+    virtual BOOL OnColorOK()
+    {
+        m_colorsAtColorOk.push_back(GetColor());
+        return m_nRejects-- > 0;
+    }
+
+    int m_nInit = 0;
+    int m_nOk = 0;
+    int m_nRejects = 0;
+    HWND m_hWndAtInit = NULL;
+    bool m_bAttachedAtInit = false;
+    COLORREF m_clrSetAtInit = CLR_INVALID;
+    std::vector<COLORREF> m_colorsAtColorOk;
+};
+
+TEST(CColorDialogTest, TheObjectGetsTheDialogsMessages)
+{
+    CRecordingColorDialog dlg;
+    HWND hSeen = NULL;
+    DialogSteps steps({ [&](HWND h) {
+        hSeen = h;
+        return TypeColourAndOk(h, 0, 128, 255);
+    } });
+    EXPECT_EQ(IDOK, dlg.DoModal());
+    EXPECT_EQ(1, dlg.m_nInit);
+    EXPECT_EQ(hSeen, dlg.m_hWndAtInit);
+    EXPECT_TRUE(dlg.m_bAttachedAtInit);
+    EXPECT_EQ(1, dlg.m_nOk);
+    EXPECT_EQ(RGB(0, 128, 255), dlg.GetColor());
+    EXPECT_EQ(nullptr, dlg.m_hWnd);
+    EXPECT_EQ(nullptr, CWnd::FromHandlePermanent(hSeen));
+}
+
+// Wine 8's colour dialog neither handles SETRGBSTRING nor sends COLOROKSTRING to the
+// hook: the tests check the framework's side of both (the message sent to the running
+// dialog; the hook's answer to the OK notification) and mark the platform's part.
+LRESULT CALLBACK RecordSetRgb(HWND hwnd, UINT msg, WPARAM wParam, LPARAM lParam, UINT_PTR, DWORD_PTR ref)
+{
+    if (msg == ::RegisterWindowMessage(SETRGBSTRING))
+        reinterpret_cast<std::vector<LPARAM>*>(ref)->push_back(lParam);
+    return ::DefSubclassProc(hwnd, msg, wParam, lParam);
+}
+
+TEST(CColorDialogTest, SetCurrentColorSendsSetRgbToTheRunningDialog)
+{
+    CRecordingColorDialog dlg;
+    std::vector<LPARAM> sent;
+    DialogSteps steps({ [&](HWND h) {
+        ::SetWindowSubclass(h, RecordSetRgb, 1, reinterpret_cast<DWORD_PTR>(&sent));
+        dlg.SetCurrentColor(RGB(12, 34, 56));
+        ::RemoveWindowSubclass(h, RecordSetRgb, 1);
+        ::PostMessage(h, WM_COMMAND, IDOK, 0);
+        return true;
+    } });
+    EXPECT_EQ(IDOK, dlg.DoModal());
+    EXPECT_EQ((std::vector<LPARAM>{ static_cast<LPARAM>(RGB(12, 34, 56)) }), sent);
+    // Known platform deviation: Wine ignores the message, the colour stays black.
+    EXPECT_EQ(RGB(0, 0, 0), dlg.GetColor());
+}
+
+TEST(CColorDialogTest, HookAsksOnColorOkWhetherToStayOpen)
+{
+    CRecordingColorDialog dlg;
+    dlg.m_nRejects = 1;
+    const UINT nColorOk = ::RegisterWindowMessage(COLOROKSTRING);
+    std::vector<UINT_PTR> answers;
+    DialogSteps steps({ [&](HWND h) {
+        CHOOSECOLOR cc = dlg.m_cc;
+        cc.rgbResult = RGB(1, 1, 1);
+        answers.push_back(_AfxCommDlgProc(h, nColorOk, 0, reinterpret_cast<LPARAM>(&cc)));
+        cc.rgbResult = RGB(2, 2, 2);
+        answers.push_back(_AfxCommDlgProc(h, nColorOk, 0, reinterpret_cast<LPARAM>(&cc)));
+        ::PostMessage(h, WM_COMMAND, IDOK, 0);
+        return true;
+    } });
+    EXPECT_EQ(IDOK, dlg.DoModal());
+    EXPECT_EQ((std::vector<UINT_PTR>{ TRUE, FALSE }), answers);
+    EXPECT_EQ((std::vector<COLORREF>{ RGB(1, 1, 1), RGB(2, 2, 2) }), dlg.m_colorsAtColorOk);
+    // Known platform deviation: Wine's own OK sends no COLOROKSTRING.
+    EXPECT_EQ(2u, dlg.m_colorsAtColorOk.size());
+}
+
+} // namespace
