@@ -6,7 +6,9 @@
 //  - the slider cursor is 32 x 32 monochrome with its hot spot at (15, 15)
 //  - the process-wide clipboard format is the registered "HeaderCtrl Item"
 //  - the file version record
+//  - the library's run-time classes are found by name once it is loaded
 #include <afxwin.h>
+#include <afxcmn.h>
 
 #include <gtest/gtest.h>
 
@@ -49,6 +51,7 @@ TEST(LibraryFrame, ResourceChainFindsTheLibraryOnlyAfterLoading)
     CString text;
     EXPECT_FALSE(text.LoadString(IDS_COLOR));
     EXPECT_NE(AfxFindResourceHandle(MAKEINTRESOURCE(IDD_COLUMNS_PAGE), RT_DIALOG), LibraryModule());
+    EXPECT_EQ(nullptr, CRuntimeClass::FromName("CMultiTree")) << "the library's classes are its own until loading";
 
     EnsureLibraryLoaded();
 
@@ -56,6 +59,26 @@ TEST(LibraryFrame, ResourceChainFindsTheLibraryOnlyAfterLoading)
     EXPECT_STREQ(L"Color", static_cast<LPCTSTR>(text));
     EXPECT_EQ(AfxFindResourceHandle(MAKEINTRESOURCE(IDD_COLUMNS_PAGE), RT_DIALOG), LibraryModule());
     EXPECT_EQ(AfxFindResourceHandle(MAKEINTRESOURCE(IDC_SLIDER_CURSOR), RT_GROUP_CURSOR), LibraryModule());
+}
+
+TEST(LibraryFrame, RunTimeClassRecordsAreFoundByName)
+{
+    EnsureLibraryLoaded();
+    CRuntimeClass* tree = CRuntimeClass::FromName("KVXMultiTreeBase");
+    CRuntimeClass* multi = CRuntimeClass::FromName(L"CMultiTree");
+    ASSERT_NE(nullptr, tree);
+    ASSERT_NE(nullptr, multi);
+    EXPECT_STREQ("KVXMultiTreeBase", tree->m_lpszClassName);
+    EXPECT_EQ(0xFFFF, tree->m_wSchema);
+    EXPECT_TRUE(multi->IsDerivedFrom(tree));
+    EXPECT_TRUE(tree->IsDerivedFrom(RUNTIME_CLASS(CTreeCtrl)));
+    EXPECT_EQ(nullptr, multi->m_pfnCreateObject) << "only the base is dynamically creatable";
+
+    CObject* created = tree->CreateObject();
+    ASSERT_NE(nullptr, created);
+    EXPECT_TRUE(created->IsKindOf(RUNTIME_CLASS(CTreeCtrl)));
+    EXPECT_EQ(tree, created->GetRuntimeClass());
+    delete created;
 }
 
 struct StringCase

@@ -1,0 +1,356 @@
+// Decisions of the multi-selection tree without a window:
+// - how a state request splits into caret moves and a notified selection change;
+// - which items a range selects and deselects, with and without `only`;
+// - press routing, pre-selection and click plans by button and modifier keys;
+// - drag distance, band geometry, auto-scroll and the band's per-item decision.
+#include <gtest/gtest.h>
+
+#include "TreeSelectionMath.h"
+
+#include <string>
+
+using namespace TreeSelectionMath;
+
+namespace {
+
+// ---------------------------------------------------------------------------------
+// PlanStateRequest
+
+struct PlanCase
+{
+    const char* name;
+    UINT state;
+    UINT mask;
+    bool itemIsCaret;
+    bool caretSelected;
+    bool itemSelected;
+    // expected: "R" release selected caret, "M" make caret, "X" remove caret,
+    // "S" restore the item's selection, then "st/mk" of the remaining request
+    const char* steps;
+    UINT restState;
+    UINT restMask;
+};
+
+std::string Steps(const StatePlan& p)
+{
+    std::string s;
+    if (p.releaseSelectedCaret) s += 'R';
+    if (p.makeCaret) s += 'M';
+    if (p.removeCaret) s += 'X';
+    if (p.restoreItemSelection) s += 'S';
+    return s;
+}
+
+const UINT F = kFocused;
+const UINT S = kSelected;
+const UINT BOLD = 0x0010;   // TVIS_BOLD: passes through untouched
+
+const PlanCase kPlanCases[] = {
+    // Focus without selection
+    { "FocusOtherItem_SelectedCaret_ItemUnselected", F, F, false, true, false, "RM", 0, S },
+    { "FocusOtherItem_SelectedCaret_ItemSelected", F, F, false, true, true, "RM", 0, 0 },
+    { "FocusOtherItem_UnselectedCaret_ItemUnselected", F, F, false, false, false, "M", 0, S },
+    { "FocusCaretItself_Unselected", F, F, true, false, false, "M", 0, S },
+    { "FocusCaretItself_Selected", F, F, true, true, true, "M", 0, 0 },
+    // Focus with selection
+    { "FocusSelectOtherItem", F | S, F | S, false, true, false, "RM", 0, 0 },
+    { "FocusSelectOtherItem_NoSelectedCaret", F | S, F | S, false, false, false, "M", 0, 0 },
+    { "FocusSelectUnselectedCaret", F | S, F | S, true, false, false, "M", S, S },
+    { "FocusSelectSelectedCaret", F | S, F | S, true, true, true, "M", 0, 0 },
+    { "FocusDeselectOtherItem", F, F | S, false, true, true, "RM", 0, S },
+    // Taking the focus away
+    { "UnfocusSelectedCaret", 0, F, true, true, true, "XS", 0, 0 },
+    { "UnfocusUnselectedCaret", 0, F, true, false, false, "X", 0, 0 },
+    { "UnfocusAndDeselectCaret", 0, F | S, true, true, true, "X", 0, S },
+    { "UnfocusKeepSelectedCaret", S, F | S, true, true, true, "XS", 0, 0 },
+    // Open case: selecting an unselected caret while taking its focus selects it
+    // through the notified change.
+    { "UnfocusAndSelectUnselectedCaret", S, F | S, true, false, false, "X", S, S },
+    { "UnfocusItemThatIsNotCaret", 0, F, false, true, false, "", 0, 0 },
+    // No focus in the mask
+    { "SelectOnly", S, S, false, true, false, "", S, S },
+    { "DeselectOnly", 0, S, true, true, true, "", 0, S },
+    { "FocusBitInStateOnly_Ignored", F | S, S, false, false, false, "", S, S },
+    { "OtherBitsPassThrough", F | BOLD, F | BOLD, false, true, true, "RM", BOLD, BOLD },
+    { "EmptyMask", S, 0, false, false, false, "", 0, 0 },
+};
+
+class PlanStateRequestTest : public testing::TestWithParam<PlanCase> {};
+
+TEST_P(PlanStateRequestTest, Steps)
+{
+    const PlanCase& c = GetParam();
+    StateRequest r{ c.state, c.mask, c.itemIsCaret, c.caretSelected, c.itemSelected };
+    const StatePlan plan = PlanStateRequest(r);
+    EXPECT_EQ(c.steps, Steps(plan));
+    EXPECT_EQ(c.restState, plan.state);
+    EXPECT_EQ(c.restMask, plan.mask);
+}
+
+INSTANTIATE_TEST_SUITE_P(Table, PlanStateRequestTest, testing::ValuesIn(kPlanCases),
+    [](const testing::TestParamInfo<PlanCase>& info) { return std::string(info.param.name); });
+
+// ---------------------------------------------------------------------------------
+// RangeSelectionWalk: items as letters, endpoints in upper case; the result marks
+// each item: s select, d deselect, . keep.
+
+struct RangeCase
+{
+    const char* name;
+    const char* items;
+    bool only;
+    bool singleItem;
+    const char* expected;
+};
+
+const RangeCase kRangeCases[] = {
+    { "MiddleOnly", "abCdEfg", true, false, "ddsssdd" },
+    { "MiddleAdd", "abCdEfg", false, false, "..sss.." },
+    { "AdjacentEndpoints", "aBCd", true, false, "dssd" },
+    { "SingleItemOnly", "abCde", true, true, "ddsdd" },
+    { "SingleItemAdd", "abCde", false, true, "..s.." },
+    { "FirstAndLastItem", "AbcD", true, false, "ssss" },
+    { "NoEndpointOnly", "abcd", true, false, "dddd" },
+    { "NoEndpointAdd", "abcd", false, false, "...." },
+    // The raw walk runs on to the end when the second endpoint never comes; the tree
+    // therefore resolves endpoints before walking.
+    { "SecondEndpointNeverComes", "aBcd", true, false, "dsss" },
+    { "EmptyTree", "", true, false, "" },
+};
+
+class RangeSelectionWalkTest : public testing::TestWithParam<RangeCase> {};
+
+TEST_P(RangeSelectionWalkTest, Marks)
+{
+    const RangeCase& c = GetParam();
+    const std::string items = c.items;
+    RangeSelectionWalk walk(c.only, c.singleItem);
+    std::string marks;
+    for (char ch : items)
+    {
+        switch (walk.Next(ch >= 'A' && ch <= 'Z'))
+        {
+        case RangeStep::Select: marks += 's'; break;
+        case RangeStep::Deselect: marks += 'd'; break;
+        case RangeStep::Keep: marks += '.'; break;
+        }
+    }
+    EXPECT_EQ(c.expected, marks);
+}
+
+INSTANTIATE_TEST_SUITE_P(Table, RangeSelectionWalkTest, testing::ValuesIn(kRangeCases),
+    [](const testing::TestParamInfo<RangeCase>& info) { return std::string(info.param.name); });
+
+// ---------------------------------------------------------------------------------
+// Presses
+
+struct PressCase
+{
+    const char* name;
+    bool hitItem;
+    UINT flags;
+    bool left;
+    bool checkBoxes;
+    PressRoute expected;
+};
+
+const PressCase kPressCases[] = {
+    { "Label", true, 0x0004, true, false, PressRoute::Item },
+    { "Icon", true, 0x0002, true, false, PressRoute::Item },
+    { "ExpandButton", true, kHitOnItemButton, true, false, PressRoute::Tree },
+    { "ExpandButtonRight", true, kHitOnItemButton, false, false, PressRoute::Tree },
+    { "StateIconWithCheckBoxes", true, kHitOnItemStateIcon, true, true, PressRoute::Tree },
+    { "StateIconWithoutCheckBoxes", true, kHitOnItemStateIcon, true, false, PressRoute::Item },
+    { "StateIconRightButton", true, kHitOnItemStateIcon, false, true, PressRoute::Item },
+    { "Indent", true, kHitOnItemIndent, true, false, PressRoute::Band },
+    { "RightOfLabel", true, kHitOnItemRight, true, false, PressRoute::Band },
+    { "Nowhere", false, kHitNowhere, true, false, PressRoute::Band },
+    { "NoItemButFlags", false, 0x0004, true, false, PressRoute::Band },
+};
+
+class ClassifyPressTest : public testing::TestWithParam<PressCase> {};
+
+TEST_P(ClassifyPressTest, Route)
+{
+    const PressCase& c = GetParam();
+    EXPECT_EQ(static_cast<int>(c.expected), static_cast<int>(ClassifyPress(c.hitItem, c.flags, c.left, c.checkBoxes)));
+}
+
+INSTANTIATE_TEST_SUITE_P(Table, ClassifyPressTest, testing::ValuesIn(kPressCases),
+    [](const testing::TestParamInfo<PressCase>& info) { return std::string(info.param.name); });
+
+TEST(PreSelection, ByButtonAndKeys)
+{
+    EXPECT_EQ(static_cast<int>(PreSelection::ShiftRange), static_cast<int>(ClassifyPreSelection(true, MK_SHIFT)));
+    EXPECT_EQ(static_cast<int>(PreSelection::ShiftRange), static_cast<int>(ClassifyPreSelection(true, MK_SHIFT | MK_CONTROL)));
+    EXPECT_EQ(static_cast<int>(PreSelection::ClearAnchor), static_cast<int>(ClassifyPreSelection(true, MK_CONTROL)));
+    EXPECT_EQ(static_cast<int>(PreSelection::SelectItem), static_cast<int>(ClassifyPreSelection(true, MK_LBUTTON)));
+    EXPECT_EQ(static_cast<int>(PreSelection::SelectKeepAnchor), static_cast<int>(ClassifyPreSelection(false, MK_RBUTTON)));
+    EXPECT_EQ(static_cast<int>(PreSelection::Nothing), static_cast<int>(ClassifyPreSelection(false, MK_SHIFT)));
+    EXPECT_EQ(static_cast<int>(PreSelection::Nothing), static_cast<int>(ClassifyPreSelection(false, MK_SHIFT | MK_CONTROL)));
+    EXPECT_EQ(static_cast<int>(PreSelection::SetAnchor), static_cast<int>(ClassifyPreSelection(false, MK_CONTROL)));
+}
+
+TEST(PlanClick, ByButtonKeysAndState)
+{
+    ClickSelection plain = PlanClick(true, 0, true);
+    EXPECT_TRUE(plain.apply);
+    EXPECT_TRUE(plain.deselectOthers);
+    EXPECT_EQ(kSelected, plain.selectedBit);
+
+    ClickSelection toggleOff = PlanClick(true, MK_CONTROL, true);
+    EXPECT_TRUE(toggleOff.apply);
+    EXPECT_FALSE(toggleOff.deselectOthers);
+    EXPECT_EQ(0u, toggleOff.selectedBit);
+
+    ClickSelection toggleOn = PlanClick(true, MK_CONTROL, false);
+    EXPECT_EQ(kSelected, toggleOn.selectedBit);
+
+    EXPECT_FALSE(PlanClick(true, MK_SHIFT, false).apply);
+    EXPECT_FALSE(PlanClick(true, MK_SHIFT | MK_CONTROL, false).apply);
+    EXPECT_FALSE(PlanClick(false, 0, false).apply);
+    EXPECT_FALSE(PlanClick(false, MK_CONTROL, false).apply);
+}
+
+TEST(DragDistance, StrictlyBeyondOnEitherAxis)
+{
+    const POINT from = { 100, 50 };
+    EXPECT_FALSE(ExceedsDragDistance(from, POINT{ 104, 54 }, 4, 4));
+    EXPECT_FALSE(ExceedsDragDistance(from, POINT{ 96, 46 }, 4, 4));
+    EXPECT_TRUE(ExceedsDragDistance(from, POINT{ 105, 50 }, 4, 4));
+    EXPECT_TRUE(ExceedsDragDistance(from, POINT{ 100, 45 }, 4, 4));
+    EXPECT_TRUE(ExceedsDragDistance(from, POINT{ -30000, 50 }, 4, 4));
+}
+
+// ---------------------------------------------------------------------------------
+// Band geometry
+
+TEST(BandGeometry, StartPointStaysInContent)
+{
+    // Pressed at (30, 40) with the tree scrolled 5 px right and 2 rows of 16 down.
+    const POINT start = ClientToContent(POINT{ 30, 40 }, 5, 2, 16);
+    EXPECT_EQ(35, start.x);
+    EXPECT_EQ(72, start.y);
+    // After scrolling 3 more rows down the start point is 48 px higher on screen.
+    const POINT now = ContentToClient(start, 5, 5, 16);
+    EXPECT_EQ(30, now.x);
+    EXPECT_EQ(-8, now.y);
+
+    const RECT band = BandRect(start, 5, 5, 16, POINT{ 10, 100 });
+    EXPECT_EQ(10, band.left);
+    EXPECT_EQ(-8, band.top);
+    EXPECT_EQ(30, band.right);
+    EXPECT_EQ(100, band.bottom);
+}
+
+TEST(BandGeometry, EmptyTreeHasNoRowHeight)
+{
+    const POINT start = ClientToContent(POINT{ 3, 4 }, 0, 7, 0);
+    EXPECT_EQ(3, start.x);
+    EXPECT_EQ(4, start.y);
+}
+
+struct TouchCase
+{
+    const char* name;
+    RECT band;
+    RECT item;
+    bool expected;
+};
+
+const TouchCase kTouchCases[] = {
+    { "Inside", { 10, 10, 50, 50 }, { 0, 16, 200, 32 }, true },
+    { "ZeroWidthBandCrossesRows", { 40, 5, 40, 40 }, { 0, 16, 200, 32 }, true },
+    { "BandEndsOnFirstPixelOfRow", { 40, 0, 60, 16 }, { 0, 16, 200, 32 }, true },
+    { "BandEndsAbove", { 40, 0, 60, 15 }, { 0, 16, 200, 32 }, false },
+    { "BandStartsOnRowBottomEdge", { 40, 32, 60, 50 }, { 0, 16, 200, 32 }, false },
+    { "BandLeftOfLabel", { 0, 0, 19, 50 }, { 20, 16, 80, 32 }, false },
+    { "BandTouchesLabelLeftPixel", { 0, 0, 20, 50 }, { 20, 16, 80, 32 }, true },
+    { "BandRightOfLabel", { 80, 0, 120, 50 }, { 20, 16, 80, 32 }, false },
+    { "EmptyItem", { 0, 0, 100, 100 }, { 20, 20, 20, 40 }, false },
+};
+
+class BandTouchesTest : public testing::TestWithParam<TouchCase> {};
+
+TEST_P(BandTouchesTest, Touches)
+{
+    const TouchCase& c = GetParam();
+    EXPECT_EQ(c.expected, BandTouches(c.band, c.item));
+}
+
+INSTANTIATE_TEST_SUITE_P(Table, BandTouchesTest, testing::ValuesIn(kTouchCases),
+    [](const testing::TestParamInfo<TouchCase>& info) { return std::string(info.param.name); });
+
+TEST(AutoScroll, OneLinePerAxisOutsideTheClientArea)
+{
+    const RECT client = { 0, 0, 200, 100 };
+    AutoScroll in = AutoScrollFor(POINT{ 0, 0 }, client);
+    EXPECT_EQ(0, in.vertical);
+    EXPECT_EQ(0, in.horizontal);
+    AutoScroll below = AutoScrollFor(POINT{ 50, 100 }, client);   // the bottom edge is outside
+    EXPECT_EQ(1, below.vertical);
+    EXPECT_EQ(0, below.horizontal);
+    AutoScroll aboveLeft = AutoScrollFor(POINT{ -1, -1 }, client);
+    EXPECT_EQ(-1, aboveLeft.vertical);
+    EXPECT_EQ(-1, aboveLeft.horizontal);
+    AutoScroll right = AutoScrollFor(POINT{ 200, 99 }, client);
+    EXPECT_EQ(0, right.vertical);
+    EXPECT_EQ(1, right.horizontal);
+}
+
+// ---------------------------------------------------------------------------------
+// DecideBandStep
+
+struct BandCase
+{
+    const char* name;
+    bool touches;
+    bool selected;
+    bool inSnapshot;
+    UINT keys;
+    BandStep expected;
+};
+
+const BandCase kBandCases[] = {
+    { "InsideUnselected", true, false, false, 0, BandStep::Select },
+    { "InsideSelected", true, true, false, 0, BandStep::Nothing },
+    { "InsideCtrlSnapshotSelected", true, true, true, MK_CONTROL, BandStep::Deselect },
+    { "InsideCtrlSnapshotDeselected", true, false, true, MK_CONTROL, BandStep::Deselect },
+    { "InsideShiftSnapshot", true, true, true, MK_SHIFT, BandStep::ForgetSnapshot },
+    { "InsideCtrlShiftSnapshot", true, true, true, MK_SHIFT | MK_CONTROL, BandStep::Deselect },
+    { "InsideSnapshotNoKeys", true, true, true, 0, BandStep::Nothing },
+    { "OutsideSelectedByBand", false, true, false, 0, BandStep::Deselect },
+    { "OutsideSnapshotDeselected", false, false, true, MK_CONTROL, BandStep::Reselect },
+    { "OutsideSnapshotSelected", false, true, true, MK_CONTROL, BandStep::Reselect },
+    { "OutsideNeither", false, false, false, MK_CONTROL, BandStep::Nothing },
+};
+
+class DecideBandStepTest : public testing::TestWithParam<BandCase> {};
+
+TEST_P(DecideBandStepTest, Step)
+{
+    const BandCase& c = GetParam();
+    EXPECT_EQ(static_cast<int>(c.expected), static_cast<int>(DecideBandStep(c.touches, c.selected, c.inSnapshot, c.keys)));
+}
+
+INSTANTIATE_TEST_SUITE_P(Table, DecideBandStepTest, testing::ValuesIn(kBandCases),
+    [](const testing::TestParamInfo<BandCase>& info) { return std::string(info.param.name); });
+
+TEST(SelectionSnapshot, AddContainsRemove)
+{
+    SelectionSnapshot snapshot;
+    int a = 0, b = 0;
+    EXPECT_TRUE(snapshot.IsEmpty());
+    snapshot.Add(&a);
+    snapshot.Add(&b);
+    snapshot.Add(&a);
+    EXPECT_EQ(2u, snapshot.Size());
+    EXPECT_TRUE(snapshot.Contains(&a));
+    snapshot.Remove(&a);
+    EXPECT_FALSE(snapshot.Contains(&a));
+    EXPECT_TRUE(snapshot.Contains(&b));
+    snapshot.Remove(&a);   // removing twice is harmless
+    EXPECT_EQ(1u, snapshot.Size());
+}
+
+} // namespace
