@@ -591,6 +591,8 @@ public:
 
     // the original window procedure of a subclassed window
     WNDPROC m_pfnSuper;
+    // owner set by SetOwner; a child window's Win32 owner slot is its parent, so it is kept here
+    HWND m_hWndOwner;
     UINT m_nFlags;                      // see WF_ flags above
     int m_nModalResult;                 // for return values from CWnd::RunModalLoop
 
@@ -1249,9 +1251,9 @@ inline DWORD CWnd::GetStyle() const
 inline DWORD CWnd::GetExStyle() const
     { return (DWORD)::GetWindowLongPtr(m_hWnd, GWL_EXSTYLE); }
 inline CWnd* CWnd::GetOwner() const
-    { return CWnd::FromHandle(::GetWindow(m_hWnd, GW_OWNER)); }
+    { return m_hWndOwner != NULL ? CWnd::FromHandle(m_hWndOwner) : GetParent(); }
 inline void CWnd::SetOwner(CWnd* pOwnerWnd)
-    { ::SetWindowLongPtr(m_hWnd, GWLP_HWNDPARENT, (LONG_PTR)pOwnerWnd->GetSafeHwnd()); }
+    { m_hWndOwner = pOwnerWnd != NULL ? pOwnerWnd->m_hWnd : NULL; }
 inline LRESULT CWnd::SendMessage(UINT message, WPARAM wParam, LPARAM lParam)
     { return ::SendMessage(m_hWnd, message, wParam, lParam); }
 inline BOOL CWnd::PostMessage(UINT message, WPARAM wParam, LPARAM lParam)

@@ -34,12 +34,12 @@ END_MESSAGE_MAP()
 // Construction, handle map
 
 CWnd::CWnd()
-    : m_hWnd(NULL), m_pfnSuper(NULL), m_nFlags(0), m_nModalResult(0)
+    : m_hWnd(NULL), m_pfnSuper(NULL), m_hWndOwner(NULL), m_nFlags(0), m_nModalResult(0)
 {
 }
 
 CWnd::CWnd(HWND hWnd)
-    : m_hWnd(hWnd), m_pfnSuper(NULL), m_nFlags(0), m_nModalResult(0)
+    : m_hWnd(hWnd), m_pfnSuper(NULL), m_hWndOwner(NULL), m_nFlags(0), m_nModalResult(0)
 {
 }
 

@@ -386,6 +386,24 @@ TEST(WndLifetime, NullObjectHasNoHandle)
 /////////////////////////////////////////////////////////////////////////////
 // Wrappers worth a check: tree access and text
 
+TEST(WndWrappers, OwnerDefaultsToTheParentAndSetOwnerKeepsTheParent)
+{
+    CCreateWnd parent;
+    ASSERT_TRUE(parent.CreateEx(0, NULL, L"parent", WS_POPUP, PopupRect(), NULL, 0));
+    CCreateWnd other;
+    ASSERT_TRUE(other.CreateEx(0, NULL, L"other", WS_POPUP, PopupRect(), NULL, 0));
+    CEdit edit;
+    ASSERT_TRUE(edit.Create(WS_CHILD, CRect(0, 0, 100, 20), &parent, 13));
+
+    EXPECT_EQ(&parent, edit.GetOwner());
+    edit.SetOwner(&other);
+    EXPECT_EQ(&other, edit.GetOwner());
+    EXPECT_EQ(&parent, edit.GetParent()) << "a child's owner is not its Win32 parent slot";
+    EXPECT_EQ(parent.m_hWnd, ::GetParent(edit.m_hWnd));
+    edit.SetOwner(NULL);
+    EXPECT_EQ(&parent, edit.GetOwner());
+}
+
 TEST(WndWrappers, TreeAndText)
 {
     CCreateWnd parent;
