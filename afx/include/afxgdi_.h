@@ -265,6 +265,8 @@ public:
 
     static CDC* PASCAL FromHandle(HDC hDC);
     static void PASCAL DeleteTempMap();
+    // A 50% dither pattern brush, drawn in the DC's text and background colours.
+    static CBrush* PASCAL GetHalftoneBrush();
     BOOL Attach(HDC hDC);
     HDC Detach();
 

@@ -1044,3 +1044,17 @@ CWindowDC::~CWindowDC()
     if (m_hDC != NULL)
         ::ReleaseDC(m_hWnd, Detach());
 }
+
+CBrush* PASCAL CDC::GetHalftoneBrush()
+{
+    // Made once for the process and released when the layer unloads.
+    static CBrush brush;
+    if (brush.m_hObject == NULL)
+    {
+        static const WORD kPattern[8] = { 0x5555, 0xAAAA, 0x5555, 0xAAAA, 0x5555, 0xAAAA, 0x5555, 0xAAAA };
+        CBitmap bitmap;
+        if (bitmap.CreateBitmap(8, 8, 1, 1, kPattern))
+            brush.CreatePatternBrush(&bitmap);
+    }
+    return brush.m_hObject != NULL ? &brush : NULL;
+}

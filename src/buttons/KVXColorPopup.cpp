@@ -12,20 +12,6 @@ BEGIN_MESSAGE_MAP(KVXColorPopup, CDialog)
     ON_BN_CLICKED(IDC_COLOR_OTHER, OnOther)
 END_MESSAGE_MAP()
 
-namespace {
-
-// A 50% dither in the DC's text and background colours.
-BOOL CreateHalftoneBrush(CBrush& brush)
-{
-    static const WORD kPattern[8] = { 0x5555, 0xAAAA, 0x5555, 0xAAAA, 0x5555, 0xAAAA, 0x5555, 0xAAAA };
-    CBitmap bitmap;
-    if (!bitmap.CreateBitmap(8, 8, 1, 1, kPattern))
-        return FALSE;
-    return brush.CreatePatternBrush(&bitmap);
-}
-
-} // namespace
-
 KVXColorPopup::KVXColorPopup()
     : CDialog(IDD_COLOR_POPUP),
       m_clrColor(RGB(0, 0, 0)),
@@ -159,9 +145,8 @@ void KVXColorPopup::DrawCell(CDC* pDC, const CRect& rcButton, COLORREF clr, BOOL
         {
             // Latched look: dithered inside the frame.
             CRect rcLatched(rcButton.left + 1, rcButton.top + 1, rcButton.right - 1, rcButton.bottom - 1);
-            CBrush brushHalftone;
-            if (CreateHalftoneBrush(brushHalftone))
-                pDC->FillRect(&rcLatched, &brushHalftone);
+            if (CBrush* pHalftone = CDC::GetHalftoneBrush())
+                pDC->FillRect(&rcLatched, pHalftone);
         }
     }
 

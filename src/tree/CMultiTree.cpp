@@ -26,23 +26,16 @@ bool ReadSelectionAndIntegral(HWND hwnd, HTREEITEM hItem, bool& bSelected, int& 
 }
 
 // The band's frame: one pixel wide, XOR-drawn with the halftone pattern, so that
-// drawing the same rectangle again erases it (what CDC::DrawDragRect does for a frame
-// of 1 x 1 pixel without a previous rectangle).
+// drawing the same rectangle again erases it.
 class BandFrame
 {
 public:
-    BandFrame()
-    {
-        static const WORD kHalftone[8] = { 0x5555, 0xAAAA, 0x5555, 0xAAAA, 0x5555, 0xAAAA, 0x5555, 0xAAAA };
-        if (m_bitmap.CreateBitmap(8, 8, 1, 1, kHalftone))
-            m_brush.CreatePatternBrush(&m_bitmap);
-    }
-
     void Toggle(CDC& dc, const CRect& rc)
     {
-        if (m_brush.m_hObject == NULL || rc.IsRectEmpty())
+        CBrush* pBrush = CDC::GetHalftoneBrush();
+        if (pBrush == NULL || rc.IsRectEmpty())
             return;
-        CBrush* pOld = dc.SelectObject(&m_brush);
+        CBrush* pOld = dc.SelectObject(pBrush);
         const int w = rc.Width();
         const int h = rc.Height();
         // Each pixel of the frame exactly once: top and bottom rows, then the sides between.
@@ -57,10 +50,6 @@ public:
         }
         dc.SelectObject(pOld);
     }
-
-private:
-    CBitmap m_bitmap;
-    CBrush m_brush;
 };
 
 } // namespace

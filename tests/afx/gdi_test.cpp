@@ -232,6 +232,31 @@ TEST_F(GdiTest, FillSolidRectAndDraw3dRectPixels)
     EXPECT_EQ(RGB(1, 2, 3), dc.GetPixel(CPoint(1, 1)));
 }
 
+TEST_F(GdiTest, HalftoneBrushDithersInTextAndBackgroundColours)
+{
+    CBrush* pBrush = CDC::GetHalftoneBrush();
+    ASSERT_NE(nullptr, pBrush);
+    EXPECT_EQ(pBrush, CDC::GetHalftoneBrush()) << "one brush for the process";
+
+    Canvas canvas(8, 8);
+    CDC& dc = canvas.dc;
+    const COLORREF text = RGB(200, 0, 0), back = RGB(0, 0, 200);
+    dc.SetTextColor(text);
+    dc.SetBkColor(back);
+    dc.FillRect(CRect(0, 0, 8, 8), pBrush);
+    int nText = 0, nBack = 0;
+    for (int y = 0; y < 8; ++y)
+        for (int x = 0; x < 8; ++x)
+        {
+            const COLORREF c = dc.GetPixel(x, y);
+            nText += c == text;
+            nBack += c == back;
+            EXPECT_NE(c, dc.GetPixel((x + 1) % 8, y)) << "neighbours differ at " << x << "," << y;
+        }
+    EXPECT_EQ(32, nText);
+    EXPECT_EQ(32, nBack);
+}
+
 TEST_F(GdiTest, PointFontFollowsTheDeviceResolution)
 {
     CClientDC screen(NULL);
