@@ -15,17 +15,6 @@ using namespace tree_test;
 
 namespace {
 
-const char* const kSmallTree =
-    "A\n"
-    " A1\n"
-    " A2\n"
-    "  A2a\n"
-    "B\n"
-    "C\n"
-    " C1\n"
-    "D\n"
-    "E\n";
-
 class MouseTest : public TreeFixture
 {
 protected:

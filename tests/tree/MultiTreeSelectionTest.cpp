@@ -17,17 +17,6 @@ using orvane_test::SendKey;
 
 namespace {
 
-const char* const kSmallTree =
-    "A\n"
-    " A1\n"
-    " A2\n"
-    "  A2a\n"
-    "B\n"
-    "C\n"
-    " C1\n"
-    "D\n"
-    "E\n";
-
 class SelectionTest : public TreeFixture
 {
 protected:

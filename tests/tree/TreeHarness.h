@@ -22,6 +22,18 @@
 
 namespace tree_test {
 
+// The small tree most cases use: one item a line, indented by depth.
+inline const char* const kSmallTree =
+    "A\n"
+    " A1\n"
+    " A2\n"
+    "  A2a\n"
+    "B\n"
+    "C\n"
+    " C1\n"
+    "D\n"
+    "E\n";
+
 class CTestTree : public CMultiTree
 {
 public:
