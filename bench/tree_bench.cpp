@@ -15,6 +15,7 @@
 
 #include "CMultiTree.h"
 #include "OrvaneControls.h"
+#include "TreeSelectionMath.h"
 
 #include <algorithm>
 #include <cstdio>

@@ -1,11 +1,14 @@
 // The gallery: a host application that shows each family of controls on a page
 // of its own. With "/screenshots <folder>" it paints every page once, writes a
-// bitmap of it into the folder and quits (used where there is no display).
+// bitmap of it into the folder (page01-library.bmp, ...) and quits (used where
+// there is no display).
 #include <afxwin.h>
 #include <commctrl.h>
 
 #include "GalleryPage.h"
 #include "OrvaneControls.h"
+
+#include <cwctype>
 
 namespace {
 
@@ -56,6 +59,26 @@ bool SaveClientBitmap(HWND hwnd, const CString& path)
     return ok;
 }
 
+// "Numeric edits" -> "numeric-edits": a file name that stays when pages are added.
+CString FileNameOf(LPCTSTR title)
+{
+    CString name;
+    bool bGap = false;
+    for (LPCTSTR p = title; *p != 0; ++p)
+    {
+        if (!iswalnum(*p))
+        {
+            bGap = true;
+            continue;
+        }
+        if (bGap && !name.IsEmpty())
+            name += _T('-');
+        name += static_cast<TCHAR>(towlower(*p));
+        bGap = false;
+    }
+    return name;
+}
+
 } // namespace
 
 GalleryPageEntry::GalleryPageEntry(int order_, GalleryPageFactory factory_)
@@ -79,6 +102,7 @@ public:
     BOOL CreateGallery();
     void ShowPage(int index);
     int GetPageCount() const { return static_cast<int>(m_pages.GetSize()); }
+    LPCTSTR GetPageTitle(int index) const { return static_cast<CGalleryPage*>(m_pages.GetAt(index))->GetTitle(); }
 
 protected:
     afx_msg int OnCreate(LPCREATESTRUCT lpCreateStruct);
@@ -263,7 +287,8 @@ void CGalleryApp::WriteScreenshots(CGalleryWnd* wnd, const CString& folder)
         }
         wnd->RedrawWindow(nullptr, nullptr, RDW_INVALIDATE | RDW_ERASE | RDW_UPDATENOW | RDW_ALLCHILDREN);
         CString path;
-        path.Format(_T("%s\\page%02d.bmp"), static_cast<LPCTSTR>(folder), i + 1);
+        path.Format(_T("%s\\page%02d-%s.bmp"), static_cast<LPCTSTR>(folder), i + 1,
+                    static_cast<LPCTSTR>(FileNameOf(wnd->GetPageTitle(i))));
         SaveClientBitmap(wnd->GetSafeHwnd(), path);
     }
 }

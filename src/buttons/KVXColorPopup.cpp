@@ -1,4 +1,5 @@
 #include "KVXColorPopup.h"
+#include "ColorGridGeometry.h"
 
 #include "KVXColorDialog.h"
 #include "KVXColorWell.h"

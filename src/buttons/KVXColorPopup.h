@@ -7,7 +7,7 @@
 #include <afxwin.h>
 #include <afxtempl.h>
 
-#include "ColorGridGeometry.h"
+namespace ColorGridGeometry { struct ColorGridLayout; }
 
 class KVXColorWell;
 

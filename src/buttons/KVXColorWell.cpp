@@ -1,4 +1,5 @@
 #include "KVXColorWell.h"
+#include "ColorGridGeometry.h"
 
 #include "resource.h"
 

@@ -1,4 +1,5 @@
 #include "CMultiTree.h"
+#include "TreeSelectionMath.h"
 
 #include <windowsx.h>
 

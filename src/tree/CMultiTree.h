@@ -11,7 +11,8 @@
 #include <afxtempl.h>
 
 #include "KVXMultiTreeBase.h"
-#include "TreeSelectionMath.h"
+
+namespace TreeSelectionMath { class SelectionSnapshot; }
 
 class AFX_EXT_CLASS CMultiTree : public KVXMultiTreeBase
 {

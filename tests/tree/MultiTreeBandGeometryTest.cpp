@@ -3,6 +3,7 @@
 // scrolled tree with rows of different integral heights (rows scrolled out above the
 // client area included); with label hit testing a band beside the label misses.
 #include "TreeHarness.h"
+#include "TreeSelectionMath.h"
 
 using namespace tree_test;
 
