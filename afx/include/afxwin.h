@@ -10,6 +10,7 @@
 #endif
 #include <atltypes.h>
 #include <commctrl.h>
+#include <objbase.h>
 #include "afxres.h"
 
 #ifndef RT_DLGINIT
@@ -37,6 +38,7 @@ class CFrameWnd;
 class CView;
 class CDocument;
 class CDocTemplate;
+class COleDropTarget;
 struct CCreateContext;
 
 #include "afxgdi_.h"
@@ -138,6 +140,66 @@ struct CCreateContext
 };
 
 /////////////////////////////////////////////////////////////////////////////
+// Interface maps: the COM interfaces a CCmdTarget implements as nested parts
+
+struct AFX_INTERFACEMAP_ENTRY
+{
+    const void* piid;       // the interface id (NULL ends the map)
+    size_t nOffset;         // offset of the interface part within the object
+};
+
+struct AFX_INTERFACEMAP
+{
+    const AFX_INTERFACEMAP* (PASCAL* pfnGetBaseMap)();  // NULL for CCmdTarget's own map
+    const AFX_INTERFACEMAP_ENTRY* pEntry;
+};
+
+#define DECLARE_INTERFACE_MAP() \
+private: \
+    static const AFX_INTERFACEMAP_ENTRY _interfaceEntries[]; \
+protected: \
+    static const AFX_INTERFACEMAP interfaceMap; \
+    static const AFX_INTERFACEMAP* PASCAL GetThisInterfaceMap(); \
+    virtual const AFX_INTERFACEMAP* GetInterfaceMap() const;
+
+#define BEGIN_INTERFACE_MAP(theClass, theBase) \
+    const AFX_INTERFACEMAP* PASCAL theClass::GetThisInterfaceMap() \
+        { return &theClass::interfaceMap; } \
+    const AFX_INTERFACEMAP* theClass::GetInterfaceMap() const \
+        { return &theClass::interfaceMap; } \
+    const AFX_INTERFACEMAP theClass::interfaceMap = \
+        { &theBase::GetThisInterfaceMap, &theClass::_interfaceEntries[0] }; \
+    const AFX_INTERFACEMAP_ENTRY theClass::_interfaceEntries[] = \
+    {
+
+#define INTERFACE_PART(theClass, iid, localClass) \
+        { &iid, offsetof(theClass, m_x##localClass) },
+
+#define END_INTERFACE_MAP() \
+        { NULL, (size_t)-1 } \
+    };
+
+// One nested class per interface; its IUnknown methods delegate to the object.
+#define BEGIN_INTERFACE_PART(localClass, baseClass) \
+    class X##localClass : public baseClass \
+    { \
+    public: \
+        STDMETHOD_(ULONG, AddRef)(); \
+        STDMETHOD_(ULONG, Release)(); \
+        STDMETHOD(QueryInterface)(REFIID iid, LPVOID* ppvObj);
+
+#define END_INTERFACE_PART(localClass) \
+    } m_x##localClass; \
+    friend class X##localClass;
+
+// Inside a method of an interface part: pThis is the object that contains it.
+#define METHOD_PROLOGUE(theClass, localClass) \
+    theClass* pThis = ((theClass*)((BYTE*)this - offsetof(theClass, m_x##localClass))); \
+    (void)pThis;
+#define METHOD_PROLOGUE_EX(theClass, localClass) METHOD_PROLOGUE(theClass, localClass)
+#define METHOD_PROLOGUE_EX_(theClass, localClass) METHOD_PROLOGUE(theClass, localClass)
+
+/////////////////////////////////////////////////////////////////////////////
 // CCmdTarget: an object that receives commands through its message map
 
 class CCmdTarget : public CObject
@@ -163,6 +225,23 @@ public:
     virtual ~CCmdTarget();
 
     DECLARE_MESSAGE_MAP()
+
+// OLE: reference count and the interfaces of the interface map. An object starts
+// with one reference (its own); the last Release calls OnFinalRelease.
+public:
+    DWORD InternalQueryInterface(const void* iid, LPVOID* ppvObj);
+    DWORD InternalAddRef();
+    DWORD InternalRelease();
+    DWORD ExternalQueryInterface(const void* iid, LPVOID* ppvObj);
+    DWORD ExternalAddRef();
+    DWORD ExternalRelease();
+    LPUNKNOWN GetInterface(const void* iid);
+
+    virtual void OnFinalRelease();      // default: delete this
+
+    long m_dwRef = 1;
+
+    DECLARE_INTERFACE_MAP()
 };
 
 // The entry for nMsg/nCode/nID in one map's entries, or NULL.
@@ -595,6 +674,8 @@ public:
     HWND m_hWndOwner;
     UINT m_nFlags;                      // see WF_ flags above
     int m_nModalResult;                 // for return values from CWnd::RunModalLoop
+    // registered by COleDropTarget::Register; OnNcDestroy revokes it
+    COleDropTarget* m_pDropTarget = NULL;
 
     static BOOL PASCAL WalkPreTranslateTree(HWND hWndStop, MSG* pMsg);
     static HWND PASCAL GetSafeOwner_(HWND hWnd, HWND* pWndTop);
@@ -1135,6 +1216,9 @@ public:
     virtual ~CWinThread();
     virtual void Delete();
     static const MSG* PASCAL GetCurrentMessage();
+
+    // set by AfxOleInit: AfxWinTerm calls it with bTerm TRUE to end OLE
+    void (AFXAPI* m_lpfnOleTermOrFreeLib)(BOOL bTerm, BOOL bJustRevoke) = NULL;
 };
 
 class CWinApp : public CWinThread
