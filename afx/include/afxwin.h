@@ -1301,6 +1301,110 @@ protected:
 };
 
 /////////////////////////////////////////////////////////////////////////////
+// Frame windows and the wait cursor
+
+// CFrameWnd styles
+#define FWS_ADDTOTITLE      0x00008000L
+#define FWS_PREFIXTITLE     0x00040000L
+#define FWS_SNAPTOBARS      0x00080000L
+
+// CMiniFrameWnd styles
+#define MFS_SYNCACTIVE      0x00000100L
+#define MFS_4THICKFRAME     0x00000200L
+#define MFS_THICKFRAME      0x00000400L
+#define MFS_MOVEFRAME       0x00000800L
+#define MFS_BLOCKSYSMENU    0x00001000L
+
+#ifndef AFX_IDW_PANE_FIRST
+#define AFX_IDW_PANE_FIRST  0xE900      // the child that fills the frame's client area
+#endif
+
+// A frame window lives on the heap: its window's destruction deletes it.
+class CFrameWnd : public CWnd
+{
+    DECLARE_DYNCREATE(CFrameWnd)
+
+// Constructors
+public:
+    static const CRect rectDefault;
+    CFrameWnd();
+
+    virtual BOOL Create(LPCTSTR lpszClassName, LPCTSTR lpszWindowName,
+        DWORD dwStyle = WS_OVERLAPPEDWINDOW, const RECT& rect = rectDefault,
+        CWnd* pParentWnd = NULL, LPCTSTR lpszMenuName = NULL, DWORD dwExStyle = 0,
+        CCreateContext* pContext = NULL);
+
+// Attributes
+    CString GetTitle() const;
+    void SetTitle(LPCTSTR lpszTitle);
+
+// Operations
+    // sizes the pane (child AFX_IDW_PANE_FIRST) to the client area
+    virtual void RecalcLayout(BOOL bNotify = TRUE);
+
+// Overridables
+protected:
+    virtual BOOL OnCreateClient(LPCREATESTRUCT lpcs, CCreateContext* pContext);
+
+// Implementation
+public:
+    virtual ~CFrameWnd();
+    virtual BOOL PreCreateWindow(CREATESTRUCT& cs);
+
+protected:
+    CString m_strTitle;
+    BOOL m_bInRecalcLayout;
+
+    virtual void PostNcDestroy();       // delete this
+    int OnCreateHelper(LPCREATESTRUCT lpcs, CCreateContext* pContext);
+
+    afx_msg int OnCreate(LPCREATESTRUCT lpCreateStruct);
+    afx_msg void OnClose();
+    afx_msg void OnSetFocus(CWnd* pOldWnd);
+    afx_msg void OnSize(UINT nType, int cx, int cy);
+    afx_msg void OnActivate(UINT nState, CWnd* pWndOther, BOOL bMinimized);
+
+    DECLARE_MESSAGE_MAP()
+};
+
+// A tool window with a small caption (WS_EX_TOOLWINDOW), e.g. a floating palette.
+class CMiniFrameWnd : public CFrameWnd
+{
+    DECLARE_DYNCREATE(CMiniFrameWnd)
+
+// Constructors
+public:
+    CMiniFrameWnd();
+    virtual BOOL Create(LPCTSTR lpClassName, LPCTSTR lpWindowName, DWORD dwStyle,
+        const RECT& rect, CWnd* pParentWnd = NULL, UINT nID = 0);
+    virtual BOOL CreateEx(DWORD dwExStyle, LPCTSTR lpClassName, LPCTSTR lpWindowName,
+        DWORD dwStyle, const RECT& rect, CWnd* pParentWnd = NULL, UINT nID = 0);
+
+// Implementation
+public:
+    virtual ~CMiniFrameWnd();
+    virtual BOOL PreCreateWindow(CREATESTRUCT& cs);
+
+protected:
+    CString m_strCaption;
+
+    DECLARE_MESSAGE_MAP()
+};
+
+// Shows the wait cursor for its lifetime (the application's DoWaitCursor).
+class CWaitCursor
+{
+// Construction/Destruction
+public:
+    CWaitCursor();
+    ~CWaitCursor();
+
+// Operations
+public:
+    void Restore();
+};
+
+/////////////////////////////////////////////////////////////////////////////
 // Global functions
 
 CWinApp* AFXAPI AfxGetApp();
@@ -1928,5 +2032,17 @@ inline HICON CWinApp::LoadStandardIcon(LPCTSTR lpszIconName) const
     { return ::LoadIcon(NULL, lpszIconName); }
 inline HICON CWinApp::LoadOEMIcon(UINT nIDIcon) const
     { return ::LoadIcon(NULL, MAKEINTRESOURCE(nIDIcon)); }
+
+// CFrameWnd / CWaitCursor
+inline CString CFrameWnd::GetTitle() const
+    { return m_strTitle; }
+inline void CFrameWnd::SetTitle(LPCTSTR lpszTitle)
+    { m_strTitle = lpszTitle; }
+inline CWaitCursor::CWaitCursor()
+    { AfxGetApp()->BeginWaitCursor(); }
+inline CWaitCursor::~CWaitCursor()
+    { AfxGetApp()->EndWaitCursor(); }
+inline void CWaitCursor::Restore()
+    { AfxGetApp()->RestoreWaitCursor(); }
 
 #endif // __AFXWIN_H__
