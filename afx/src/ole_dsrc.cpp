@@ -298,9 +298,17 @@ BOOL COleDataSource::OnRenderData(LPFORMATETC lpFormatEtc, LPSTGMEDIUM lpStgMedi
         END_CATCH_ALL
         if (bRendered)
         {
+            SIZE_T nLength = (SIZE_T)file.GetLength();
             HGLOBAL hRendered = file.Detach();
             if (hRendered == NULL)      // nothing written: an empty block
                 hRendered = ::GlobalAlloc(GMEM_MOVEABLE | GMEM_DDESHARE, 0);
+            else if (!bCallerBlock && nLength > 0 && ::GlobalSize(hRendered) > nLength)
+            {
+                // the file grew in steps: the block ends with the data, so that
+                // its size is the data's and no stale bytes go along
+                if (HGLOBAL hShrunk = ::GlobalReAlloc(hRendered, nLength, GMEM_MOVEABLE))
+                    hRendered = hShrunk;
+            }
             if (hRendered != NULL)
             {
                 lpStgMedium->tymed = TYMED_HGLOBAL;

@@ -3,10 +3,9 @@
 // - CMiniFrameWnd::Create as a column chooser makes it: a tool window without a
 //   client edge, its children made in OnCreate, owned by the top-level window of
 //   the child given as parent
-// - CalcWindowRect: adjustBorder leaves the client edge out, and the window rect
-//   it gives has the requested client area
-// - a frame deletes itself when its window goes (DestroyWindow, WM_CLOSE, its
-//   owner's destruction) and when its creation fails
+// - CalcWindowRect(adjustBorder) gives the window rect of a wanted client area
+// - a frame deletes itself when its window goes with its owner, and when its
+//   creation fails
 // - CWaitCursor: nested waits, Restore after the cursor was changed, the
 //   cursor from before the first wait comes back after the last
 #include <afxwin.h>
@@ -80,31 +79,11 @@ TEST(FrameMini, CreatedOwnedByTheTopLevelWindowOfItsParent)
     EXPECT_TRUE(bDeleted);
 }
 
-TEST(FrameWnd, CalcWindowRectLeavesTheClientEdgeOutForAdjustBorder)
+TEST(FrameWnd, FailedCreationHasDeletedTheFrame)
 {
-    CFrameWnd* pFrame = new CFrameWnd;
-    ASSERT_TRUE(pFrame->Create(NULL, L"frame", WS_OVERLAPPED | WS_CAPTION, CRect(20, 20, 320, 220)));
-    ASSERT_TRUE(pFrame->GetExStyle() & WS_EX_CLIENTEDGE);
-    CRect border(0, 0, 100, 50), outside(0, 0, 100, 50);
-    pFrame->CalcWindowRect(&border, CWnd::adjustBorder);
-    pFrame->CalcWindowRect(&outside, CWnd::adjustOutside);
-    EXPECT_EQ(border.Width() + 2 * ::GetSystemMetrics(SM_CXEDGE), outside.Width());
-    EXPECT_EQ(border.Height() + 2 * ::GetSystemMetrics(SM_CYEDGE), outside.Height());
-    pFrame->DestroyWindow();
-}
-
-TEST(FrameWnd, DeletesItselfOnCloseAndOnFailedCreation)
-{
-    // WM_CLOSE destroys a frame that is not the main window
-    bool bDeleted = false;
-    CProbeFrame* pFrame = new CProbeFrame(&bDeleted);
-    ASSERT_TRUE(pFrame->Create(NULL, L"probe", kChooserStyle, CRect(0, 0, 50, 50), NULL, 0));
-    pFrame->SendMessage(WM_CLOSE);
-    EXPECT_TRUE(bDeleted);
-
     // PostNcDestroy has run when Create fails: the caller must not delete it again
-    bDeleted = false;
-    pFrame = new CProbeFrame(&bDeleted, true);
+    bool bDeleted = false;
+    CProbeFrame* pFrame = new CProbeFrame(&bDeleted, true);
     EXPECT_FALSE(pFrame->Create(NULL, L"fails", kChooserStyle, CRect(0, 0, 50, 50), NULL, 0));
     EXPECT_TRUE(bDeleted);
 }
