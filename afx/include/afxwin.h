@@ -10,6 +10,7 @@
 #endif
 #include <atltypes.h>
 #include <commctrl.h>
+#include <objbase.h>
 #include "afxres.h"
 
 #ifndef RT_DLGINIT
@@ -37,6 +38,7 @@ class CFrameWnd;
 class CView;
 class CDocument;
 class CDocTemplate;
+class COleDropTarget;
 struct CCreateContext;
 
 #include "afxgdi_.h"
@@ -138,6 +140,66 @@ struct CCreateContext
 };
 
 /////////////////////////////////////////////////////////////////////////////
+// Interface maps: the COM interfaces a CCmdTarget implements as nested parts
+
+struct AFX_INTERFACEMAP_ENTRY
+{
+    const void* piid;       // the interface id (NULL ends the map)
+    size_t nOffset;         // offset of the interface part within the object
+};
+
+struct AFX_INTERFACEMAP
+{
+    const AFX_INTERFACEMAP* (PASCAL* pfnGetBaseMap)();  // NULL for CCmdTarget's own map
+    const AFX_INTERFACEMAP_ENTRY* pEntry;
+};
+
+#define DECLARE_INTERFACE_MAP() \
+private: \
+    static const AFX_INTERFACEMAP_ENTRY _interfaceEntries[]; \
+protected: \
+    static const AFX_INTERFACEMAP interfaceMap; \
+    static const AFX_INTERFACEMAP* PASCAL GetThisInterfaceMap(); \
+    virtual const AFX_INTERFACEMAP* GetInterfaceMap() const;
+
+#define BEGIN_INTERFACE_MAP(theClass, theBase) \
+    const AFX_INTERFACEMAP* PASCAL theClass::GetThisInterfaceMap() \
+        { return &theClass::interfaceMap; } \
+    const AFX_INTERFACEMAP* theClass::GetInterfaceMap() const \
+        { return &theClass::interfaceMap; } \
+    const AFX_INTERFACEMAP theClass::interfaceMap = \
+        { &theBase::GetThisInterfaceMap, &theClass::_interfaceEntries[0] }; \
+    const AFX_INTERFACEMAP_ENTRY theClass::_interfaceEntries[] = \
+    {
+
+#define INTERFACE_PART(theClass, iid, localClass) \
+        { &iid, offsetof(theClass, m_x##localClass) },
+
+#define END_INTERFACE_MAP() \
+        { NULL, (size_t)-1 } \
+    };
+
+// One nested class per interface; its IUnknown methods delegate to the object.
+#define BEGIN_INTERFACE_PART(localClass, baseClass) \
+    class X##localClass : public baseClass \
+    { \
+    public: \
+        STDMETHOD_(ULONG, AddRef)(); \
+        STDMETHOD_(ULONG, Release)(); \
+        STDMETHOD(QueryInterface)(REFIID iid, LPVOID* ppvObj);
+
+#define END_INTERFACE_PART(localClass) \
+    } m_x##localClass; \
+    friend class X##localClass;
+
+// Inside a method of an interface part: pThis is the object that contains it.
+#define METHOD_PROLOGUE(theClass, localClass) \
+    theClass* pThis = ((theClass*)((BYTE*)this - offsetof(theClass, m_x##localClass))); \
+    (void)pThis;
+#define METHOD_PROLOGUE_EX(theClass, localClass) METHOD_PROLOGUE(theClass, localClass)
+#define METHOD_PROLOGUE_EX_(theClass, localClass) METHOD_PROLOGUE(theClass, localClass)
+
+/////////////////////////////////////////////////////////////////////////////
 // CCmdTarget: an object that receives commands through its message map
 
 class CCmdTarget : public CObject
@@ -163,6 +225,23 @@ public:
     virtual ~CCmdTarget();
 
     DECLARE_MESSAGE_MAP()
+
+// OLE: reference count and the interfaces of the interface map. An object starts
+// with one reference (its own); the last Release calls OnFinalRelease.
+public:
+    DWORD InternalQueryInterface(const void* iid, LPVOID* ppvObj);
+    DWORD InternalAddRef();
+    DWORD InternalRelease();
+    DWORD ExternalQueryInterface(const void* iid, LPVOID* ppvObj);
+    DWORD ExternalAddRef();
+    DWORD ExternalRelease();
+    LPUNKNOWN GetInterface(const void* iid);
+
+    virtual void OnFinalRelease();      // default: delete this
+
+    long m_dwRef = 1;
+
+    DECLARE_INTERFACE_MAP()
 };
 
 // The entry for nMsg/nCode/nID in one map's entries, or NULL.
@@ -595,6 +674,8 @@ public:
     HWND m_hWndOwner;
     UINT m_nFlags;                      // see WF_ flags above
     int m_nModalResult;                 // for return values from CWnd::RunModalLoop
+    // registered by COleDropTarget::Register; OnNcDestroy revokes it
+    COleDropTarget* m_pDropTarget = NULL;
 
     static BOOL PASCAL WalkPreTranslateTree(HWND hWndStop, MSG* pMsg);
     static HWND PASCAL GetSafeOwner_(HWND hWnd, HWND* pWndTop);
@@ -1135,6 +1216,9 @@ public:
     virtual ~CWinThread();
     virtual void Delete();
     static const MSG* PASCAL GetCurrentMessage();
+
+    // set by AfxOleInit: AfxWinTerm calls it with bTerm TRUE to end OLE
+    void (AFXAPI* m_lpfnOleTermOrFreeLib)(BOOL bTerm, BOOL bJustRevoke) = NULL;
 };
 
 class CWinApp : public CWinThread
@@ -1214,6 +1298,110 @@ protected:
     BOOL m_bExeNameAllocated;
 
     DECLARE_MESSAGE_MAP()
+};
+
+/////////////////////////////////////////////////////////////////////////////
+// Frame windows and the wait cursor
+
+// CFrameWnd styles
+#define FWS_ADDTOTITLE      0x00008000L
+#define FWS_PREFIXTITLE     0x00040000L
+#define FWS_SNAPTOBARS      0x00080000L
+
+// CMiniFrameWnd styles
+#define MFS_SYNCACTIVE      0x00000100L
+#define MFS_4THICKFRAME     0x00000200L
+#define MFS_THICKFRAME      0x00000400L
+#define MFS_MOVEFRAME       0x00000800L
+#define MFS_BLOCKSYSMENU    0x00001000L
+
+#ifndef AFX_IDW_PANE_FIRST
+#define AFX_IDW_PANE_FIRST  0xE900      // the child that fills the frame's client area
+#endif
+
+// A frame window lives on the heap: its window's destruction deletes it.
+class CFrameWnd : public CWnd
+{
+    DECLARE_DYNCREATE(CFrameWnd)
+
+// Constructors
+public:
+    static const CRect rectDefault;
+    CFrameWnd();
+
+    virtual BOOL Create(LPCTSTR lpszClassName, LPCTSTR lpszWindowName,
+        DWORD dwStyle = WS_OVERLAPPEDWINDOW, const RECT& rect = rectDefault,
+        CWnd* pParentWnd = NULL, LPCTSTR lpszMenuName = NULL, DWORD dwExStyle = 0,
+        CCreateContext* pContext = NULL);
+
+// Attributes
+    CString GetTitle() const;
+    void SetTitle(LPCTSTR lpszTitle);
+
+// Operations
+    // sizes the pane (child AFX_IDW_PANE_FIRST) to the client area
+    virtual void RecalcLayout(BOOL bNotify = TRUE);
+
+// Overridables
+protected:
+    virtual BOOL OnCreateClient(LPCREATESTRUCT lpcs, CCreateContext* pContext);
+
+// Implementation
+public:
+    virtual ~CFrameWnd();
+    virtual BOOL PreCreateWindow(CREATESTRUCT& cs);
+
+protected:
+    CString m_strTitle;
+    BOOL m_bInRecalcLayout;
+
+    virtual void PostNcDestroy();       // delete this
+    int OnCreateHelper(LPCREATESTRUCT lpcs, CCreateContext* pContext);
+
+    afx_msg int OnCreate(LPCREATESTRUCT lpCreateStruct);
+    afx_msg void OnClose();
+    afx_msg void OnSetFocus(CWnd* pOldWnd);
+    afx_msg void OnSize(UINT nType, int cx, int cy);
+    afx_msg void OnActivate(UINT nState, CWnd* pWndOther, BOOL bMinimized);
+
+    DECLARE_MESSAGE_MAP()
+};
+
+// A tool window with a small caption (WS_EX_TOOLWINDOW), e.g. a floating palette.
+class CMiniFrameWnd : public CFrameWnd
+{
+    DECLARE_DYNCREATE(CMiniFrameWnd)
+
+// Constructors
+public:
+    CMiniFrameWnd();
+    virtual BOOL Create(LPCTSTR lpClassName, LPCTSTR lpWindowName, DWORD dwStyle,
+        const RECT& rect, CWnd* pParentWnd = NULL, UINT nID = 0);
+    virtual BOOL CreateEx(DWORD dwExStyle, LPCTSTR lpClassName, LPCTSTR lpWindowName,
+        DWORD dwStyle, const RECT& rect, CWnd* pParentWnd = NULL, UINT nID = 0);
+
+// Implementation
+public:
+    virtual ~CMiniFrameWnd();
+    virtual BOOL PreCreateWindow(CREATESTRUCT& cs);
+
+protected:
+    CString m_strCaption;
+
+    DECLARE_MESSAGE_MAP()
+};
+
+// Shows the wait cursor for its lifetime (the application's DoWaitCursor).
+class CWaitCursor
+{
+// Construction/Destruction
+public:
+    CWaitCursor();
+    ~CWaitCursor();
+
+// Operations
+public:
+    void Restore();
 };
 
 /////////////////////////////////////////////////////////////////////////////
@@ -1844,5 +2032,17 @@ inline HICON CWinApp::LoadStandardIcon(LPCTSTR lpszIconName) const
     { return ::LoadIcon(NULL, lpszIconName); }
 inline HICON CWinApp::LoadOEMIcon(UINT nIDIcon) const
     { return ::LoadIcon(NULL, MAKEINTRESOURCE(nIDIcon)); }
+
+// CFrameWnd / CWaitCursor
+inline CString CFrameWnd::GetTitle() const
+    { return m_strTitle; }
+inline void CFrameWnd::SetTitle(LPCTSTR lpszTitle)
+    { m_strTitle = lpszTitle; }
+inline CWaitCursor::CWaitCursor()
+    { AfxGetApp()->BeginWaitCursor(); }
+inline CWaitCursor::~CWaitCursor()
+    { AfxGetApp()->EndWaitCursor(); }
+inline void CWaitCursor::Restore()
+    { AfxGetApp()->RestoreWaitCursor(); }
 
 #endif // __AFXWIN_H__

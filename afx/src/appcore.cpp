@@ -212,6 +212,10 @@ BOOL AFXAPI AfxWinInit(HINSTANCE hInstance, HINSTANCE hPrevInstance, LPTSTR lpCm
 void AFXAPI AfxWinTerm()
 {
     AfxDeleteTempObjects(0);
+    // ends OLE when AfxOleInit started it
+    CWinThread* pThread = AfxGetApp();
+    if (pThread != NULL && pThread->m_lpfnOleTermOrFreeLib != NULL)
+        (*pThread->m_lpfnOleTermOrFreeLib)(TRUE, FALSE);
     _AFX_THREAD_STATE* pThreadState = AfxGetThreadState();
     if (pThreadState->m_hHookOldCbtFilter != NULL)
     {

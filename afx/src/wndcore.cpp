@@ -2,6 +2,8 @@
 // window procedure, message map dispatch and reflection to child controls.
 #include "wndimpl.h"
 
+#include <afxole.h>
+
 IMPLEMENT_DYNCREATE(CWnd, CCmdTarget)
 
 const CWnd CWnd::wndTop(HWND_TOP);
@@ -978,6 +980,13 @@ void CWnd::OnNcDestroy()
         }
         if (pThread->m_pActiveWnd == this)
             pThread->m_pActiveWnd = NULL;
+    }
+
+    // the drop target lets go of the window before it goes
+    if (m_pDropTarget != NULL)
+    {
+        m_pDropTarget->Revoke();
+        m_pDropTarget = NULL;
     }
 
     WNDPROC pfnWndProc = (WNDPROC)::GetWindowLongPtr(m_hWnd, GWLP_WNDPROC);

@@ -1,10 +1,11 @@
 // A small extension DLL for the framework's tests: one run-time class record,
-// one string and one dialog template.
+// one string, a dialog template and a property page template.
 #pragma once
 
 #define IDS_EXT_TEST_STRING 31001
 #define IDD_EXT_TEST_DIALOG 31002
 #define IDC_EXT_TEST_EDIT   31003
+#define IDD_EXT_TEST_PAGE   31004
 
 #ifndef RC_INVOKED
 
