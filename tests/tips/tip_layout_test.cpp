@@ -1,9 +1,7 @@
-// Tip layout without windows: character wrapping (a line as wide as the limit keeps its last
-// character, one pixel more gives it back, a character wider than the limit shows nothing,
-// the line reaching the monitor's height is dropped, zero-width characters); tool tip and
-// title tip placement (fit tests, monitor edges touched and crossed, wider than the monitor,
-// above the area, moved up at the bottom, hover rectangle); and, with real fonts, the
-// fit-based wrapping against measuring after every character, one extent query per line.
+// Tip layout without windows: character wrapping (limits met exactly and by one pixel, a
+// character wider than the limit, lines dropped at the monitor's height, zero-width characters);
+// placement (fit tests, monitor edges touched and crossed, wrapping, above the area, moved up,
+// hover); with real fonts, fit-based wrapping against the per-character rule, queries per line.
 #include <windows.h>
 
 #include <gtest/gtest.h>

@@ -1,15 +1,12 @@
-// Tip windows driven as the system drives them: the class under the library's instance;
-// Show refuses while visible, without a focus window, for empty or fitting texts; at the
-// monitor's right edge the title tip is cut and the tool tip clamped, both wrapped, every line
-// drawn and kept after the system's paint; hover edges (x = right, y = bottom inside); a held
-// button hides the tool tip only; clicks on the tool tip go to the owner; in the message loop
-// the title tip hands keys to the owner, clicks and moves to the window under the mouse (in
-// non-client form over a scroll bar); no GDI object or window is left behind.
+// Tip windows driven as the system drives them: class under the library's instance; Show
+// refuses while visible, without focus, for empty or fitting texts; at the monitor's edge the
+// tool tip is clamped and wrapped, every line drawn and kept after the system's paint; hover
+// edges; held buttons; clicks, keys and moves handed on (non-client form over a scroll bar),
+// the title tip's through the message loop; no GDI object or window left behind.
 #include <afxwin.h>
 
 #include <gtest/gtest.h>
 
-#include <memory>
 #include <utility>
 #include <vector>
 
@@ -30,7 +27,6 @@ public:
     {
         CreateEx(0, AfxRegisterWndClass(0), _T("tip owner"), WS_POPUP | WS_VISIBLE, rc, NULL, 0);
     }
-    ~Owner() { DestroyWindow(); }
     HFONT m_hFont = NULL;
 
 protected:
@@ -41,20 +37,6 @@ protected:
 BEGIN_MESSAGE_MAP(Owner, CWnd)
     ON_MESSAGE(WM_GETFONT, &Owner::OnGetFont)
 END_MESSAGE_MAP()
-
-// A window beside the owner; a right click on its scroll bar opens no menu loop.
-struct Neighbour : HostWindow
-{
-    Neighbour() : HostWindow(300, 200, WS_OVERLAPPEDWINDOW | WS_VSCROLL | WS_VISIBLE)
-    {
-        ::MoveWindow(*this, 650, 200, 300, 200, TRUE);
-        CRect rc;
-        ::GetClientRect(*this, &rc);
-        ::MapWindowPoints(*this, NULL, reinterpret_cast<LPPOINT>(&rc), 2);
-        scrollBar = CPoint(rc.right + ::GetSystemMetrics(SM_CXVSCROLL) / 2, rc.CenterPoint().y);
-    }
-    CPoint scrollBar;   // on screen
-};
 
 const wchar_t kText[] = L"The whole text of a label that is cut off";
 enum { kOwnerStream = 1, kNeighbourStream = 2 };
@@ -67,9 +49,8 @@ protected:
     void SetUp() override
     {
         ::GetMonitorInfo(::MonitorFromPoint(CPoint(0, 0), MONITOR_DEFAULTTOPRIMARY), &m_monitor);
-        m_owner = std::make_unique<Owner>(CRect(200, 200, 600, 500));
-        ::SetForegroundWindow(m_owner->m_hWnd);
-        m_owner->SetFocus();
+        ::SetForegroundWindow(m_owner.m_hWnd);
+        m_owner.SetFocus();
         ::SetCursorPos(100, 900);   // away from every window of the tests
         // The font of an owner without one.
         m_font.CreateFont(-11, 0, 0, 0, FW_NORMAL, 0, 0, 0, 0, 0, 0, 0, 0, _T("MS Shell Dlg"));
@@ -78,13 +59,13 @@ protected:
 
     CSize Measure(const CString& text)
     {
-        CClientDC dc(m_owner.get());
+        CClientDC dc(&m_owner);
         CFont* old = dc.SelectObject(&m_font);
         const CSize size = dc.GetTextExtent(text);
         dc.SelectObject(old);
         return size;
     }
-    CRect Screen(CRect rc) const { m_owner->ClientToScreen(&rc); return rc; }
+    CRect Screen(CRect rc) const { m_owner.ClientToScreen(&rc); return rc; }
     static CRect WindowRect(CWnd& wnd) { CRect rc; wnd.GetWindowRect(&rc); return rc; }
     static LPARAM ClientParam(CWnd& wnd, CPoint pt) { wnd.ScreenToClient(&pt); return PointParam(pt.x, pt.y); }
 
@@ -92,13 +73,13 @@ protected:
     // tip; returns whether the tip is still shown.
     bool MoveStays(CWnd& tip, CPoint point, UINT flags = 0)
     {
-        m_owner->ClientToScreen(&point);
+        m_owner.ClientToScreen(&point);
         tip.SendMessage(WM_MOUSEMOVE, flags, ClientParam(tip, point));
         return tip.IsWindowVisible() != FALSE;
     }
 
     MONITORINFO m_monitor = { sizeof(MONITORINFO) };
-    std::unique_ptr<Owner> m_owner;
+    Owner m_owner{ CRect(200, 200, 600, 500) };
     CFont m_font;
     MsgLog m_log;
 };
@@ -106,7 +87,7 @@ protected:
 TEST_F(TipWindowTest, ToolTipShowsOnlyWhenTheTextDoesNotFit)
 {
     KVXToolTipCtrl tip;
-    ASSERT_TRUE(tip.Create(m_owner.get()));
+    ASSERT_TRUE(tip.Create(&m_owner));
     TCHAR name[32];
     ::GetClassName(tip.m_hWnd, name, 32);
     EXPECT_STREQ(_T("ZKVXToolTip"), name);
@@ -124,7 +105,7 @@ TEST_F(TipWindowTest, ToolTipShowsOnlyWhenTheTextDoesNotFit)
     ::SetFocus(NULL);
     tip.Show(area, area.TopLeft(), kText, true);
     EXPECT_FALSE(tip.IsWindowVisible()) << "no focus window";
-    m_owner->SetFocus();
+    m_owner.SetFocus();
 
     area.right -= 1;
     tip.Show(area, area.TopLeft(), kText, false);
@@ -139,23 +120,11 @@ TEST_F(TipWindowTest, ToolTipShowsOnlyWhenTheTextDoesNotFit)
     EXPECT_EQ(NULL, ::GetCapture());
 }
 
-TEST_F(TipWindowTest, AtTheMonitorEdgeTheTitleTipIsCutAndTheToolTipClampedBothWrapped)
+TEST_F(TipWindowTest, AtTheMonitorEdgeTheToolTipIsClampedWrappedAndDrawn)
 {
-    m_owner->m_hFont = static_cast<HFONT>(m_font.m_hObject);   // the owner's own font this time
     const CRect& monitor = m_monitor.rcMonitor;
-    m_owner->MoveWindow(monitor.right - 150, 300, 300, 200);
+    m_owner.MoveWindow(monitor.right - 150, 300, 300, 200);
     const int lineHeight = Measure(kText).cy;
-    KVXTitleTipCtrl title;
-    ASSERT_TRUE(title.Create(m_owner.get()));
-    const CRect cell(10, 20, 290, 37);
-    title.Show(cell, kText, 6);
-    ASSERT_TRUE(title.IsWindowVisible());
-    const CRect rcTitle = WindowRect(title);
-    EXPECT_EQ(Str(CRect(Screen(cell).left + 6, Screen(cell).top, monitor.right, rcTitle.bottom)), Str(rcTitle));
-    EXPECT_LT(2 * lineHeight, rcTitle.Height()) << "wrapped into several lines, growing downward";
-    EXPECT_EQ(OBJ_FONT, static_cast<int>(::GetObjectType(m_font.m_hObject))) << "the owner's font is kept";
-    title.ShowWindow(SW_HIDE);
-
     // A text wider than the monitor: the tool tip gets the monitor's width and goes above the area.
     CString wide;
     while (Measure(wide).cx <= 3 * monitor.Width())
@@ -164,7 +133,7 @@ TEST_F(TipWindowTest, AtTheMonitorEdgeTheTitleTipIsCutAndTheToolTipClampedBothWr
     ::SetCursorPos(Screen(area).left + 5, Screen(area).top + 5);   // system moves keep the tip
     PumpUntilIdle();
     KVXToolTipCtrl tool;
-    ASSERT_TRUE(tool.Create(m_owner.get()));
+    ASSERT_TRUE(tool.Create(&m_owner));
     tool.Show(area, area.TopLeft(), wide, false);
     ASSERT_TRUE(tool.IsWindowVisible());
     const CRect rcTool = WindowRect(tool);
@@ -199,11 +168,12 @@ TEST_F(TipWindowTest, AtTheMonitorEdgeTheTitleTipIsCutAndTheToolTipClampedBothWr
 
 TEST_F(TipWindowTest, HoverEdgesHeldButtonsAndClicks)
 {
+    m_owner.m_hFont = static_cast<HFONT>(m_font.m_hObject);   // the owner's own font this time
     const CRect area(20, 40, 120, 57);
     KVXToolTipCtrl tool;
     KVXTitleTipCtrl title;
-    ASSERT_TRUE(tool.Create(m_owner.get()));
-    ASSERT_TRUE(title.Create(m_owner.get()));
+    ASSERT_TRUE(tool.Create(&m_owner));
+    ASSERT_TRUE(title.Create(&m_owner));
     auto showTool = [&] { tool.Show(area, area.TopLeft(), kText, false); return tool.IsWindowVisible() != FALSE; };
     // The list passes the cell raised by one pixel: the title tip reaches one pixel below it.
     auto showTitle = [&] { title.Show(area, kText, 6); return title.IsWindowVisible() != FALSE; };
@@ -222,7 +192,7 @@ TEST_F(TipWindowTest, HoverEdgesHeldButtonsAndClicks)
         if (&p == &probes[6])
         {
             PumpUntilIdle();
-            m_log.SpyWindow(m_owner->m_hWnd, kOwnerStream);
+            m_log.SpyWindow(m_owner.m_hWnd, kOwnerStream);
         }
         ASSERT_TRUE(showTitle());
         EXPECT_EQ(p.titleStays, MoveStays(title, p.point, p.flags)) << p.point.x << "," << p.point.y;
@@ -241,16 +211,23 @@ TEST_F(TipWindowTest, HoverEdgesHeldButtonsAndClicks)
         { 0 }
     };
     EXPECT_MSGS(m_log, kOwnerStream, handedOver);
+    EXPECT_EQ(OBJ_FONT, static_cast<int>(::GetObjectType(m_font.m_hObject))) << "the owner's font is kept";
 }
 
 TEST_F(TipWindowTest, InTheMessageLoopKeysClicksAndMovesAreHandedOn)
 {
-    Neighbour neighbour;
-    m_owner->SetFocus();
+    // A window beside the owner; a right click on its scroll bar opens no menu loop.
+    HostWindow neighbour(300, 200, WS_OVERLAPPEDWINDOW | WS_VSCROLL | WS_VISIBLE);
+    ::MoveWindow(neighbour, 650, 200, 300, 200, TRUE);
+    CRect rcNeighbour;
+    ::GetClientRect(neighbour, &rcNeighbour);
+    ::MapWindowPoints(neighbour, NULL, reinterpret_cast<LPPOINT>(&rcNeighbour), 2);
+    const CPoint bar(rcNeighbour.right + ::GetSystemMetrics(SM_CXVSCROLL) / 2, rcNeighbour.CenterPoint().y);
+    m_owner.SetFocus();
     PumpUntilIdle();
     KVXTitleTipCtrl tip;
-    ASSERT_TRUE(tip.Create(m_owner.get()));
-    m_log.SpyWindow(m_owner->m_hWnd, kOwnerStream);
+    ASSERT_TRUE(tip.Create(&m_owner));
+    m_log.SpyWindow(m_owner.m_hWnd, kOwnerStream);
     m_log.SpyWindow(neighbour, kNeighbourStream);
     const CRect cell(20, 40, 120, 57);
     tip.Show(cell, kText, 6);
@@ -258,8 +235,8 @@ TEST_F(TipWindowTest, InTheMessageLoopKeysClicksAndMovesAreHandedOn)
     const struct { UINT message; WPARAM wParam; LPARAM lParam; bool focus; } posted[] = {
         { WM_KEYDOWN, VK_DOWN, keyParam, true },
         { WM_LBUTTONDOWN, MK_LBUTTON, ClientParam(tip, Screen(cell).TopLeft() + CPoint(30, 5)), true },   // on the tip
-        { WM_RBUTTONDOWN, MK_RBUTTON, ClientParam(tip, neighbour.scrollBar), true },
-        { WM_MOUSEMOVE, 0, ClientParam(tip, neighbour.scrollBar), true },   // not pre-translated
+        { WM_RBUTTONDOWN, MK_RBUTTON, ClientParam(tip, bar), true },
+        { WM_MOUSEMOVE, 0, ClientParam(tip, bar), true },   // not pre-translated
         { WM_USER, 0, 0, false },
     };
     for (const auto& p : posted)
@@ -288,7 +265,6 @@ TEST_F(TipWindowTest, InTheMessageLoopKeysClicksAndMovesAreHandedOn)
         { WM_IME_SETCONTEXT, Sent | Optional },
         { 0 }
     };
-    const CPoint bar = neighbour.scrollBar;
     const MsgEntry toNeighbour[] = {   // non-client forms with the hit-test code
         { WM_NCRBUTTONDOWN, WParam | LParam, HTVSCROLL, PointParam(bar.x, bar.y) },
         { WM_NCMOUSEMOVE, WParam | LParam, HTVSCROLL, PointParam(bar.x, bar.y) },
@@ -306,8 +282,8 @@ TEST_F(TipWindowTest, ShowingAndHidingManyTimesLeavesNothingBehind)
         {
             KVXToolTipCtrl tool;
             KVXTitleTipCtrl title;
-            tool.Create(m_owner.get());
-            title.Create(m_owner.get());
+            tool.Create(&m_owner);
+            title.Create(&m_owner);
             tool.Show(area, area.TopLeft(), kText, false);
             title.Show(area, kText, 6);
             EXPECT_TRUE(tool.IsWindowVisible() && title.IsWindowVisible()) << "cycle " << i;
