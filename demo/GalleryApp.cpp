@@ -34,6 +34,20 @@ bool SaveClientBitmap(HWND hwnd, const CString& path)
     HBITMAP dib = ::CreateDIBSection(screen, &info, DIB_RGB_COLORS, &bits, nullptr, 0);
     HGDIOBJ old = ::SelectObject(mem, dib);
     ::BitBlt(mem, 0, 0, rc.right, rc.bottom, screen, 0, 0, SRCCOPY);
+    // Popups of the page over the window (a tip) are separate windows: add them as shown.
+    struct Popups { HWND main; HDC mem; POINT origin; } popups = { hwnd, mem, { 0, 0 } };
+    ::ClientToScreen(hwnd, &popups.origin);
+    ::EnumThreadWindows(::GetCurrentThreadId(), [](HWND popup, LPARAM lParam) -> BOOL {
+        const Popups* p = reinterpret_cast<const Popups*>(lParam);
+        RECT rcPopup;
+        if (popup == p->main || !::IsWindowVisible(popup) || !::GetWindowRect(popup, &rcPopup))
+            return TRUE;
+        HDC dc = ::GetWindowDC(popup);
+        ::BitBlt(p->mem, rcPopup.left - p->origin.x, rcPopup.top - p->origin.y, rcPopup.right - rcPopup.left,
+                 rcPopup.bottom - rcPopup.top, dc, 0, 0, SRCCOPY);
+        ::ReleaseDC(popup, dc);
+        return TRUE;
+    }, reinterpret_cast<LPARAM>(&popups));
     ::GdiFlush();
     ::SelectObject(mem, old);
 
