@@ -1,0 +1,146 @@
+// The column record and its byte format:
+// - byte images of a default record and of a titled one, the drag payload's flag after it;
+// - read-back into fresh records; 7-bit ASCII titles byte for byte; characters the
+//   code page lacks; assignment copies every field;
+// - truncated streams stop at the end of the data, fields not read in full keep their values.
+#include <afxwin.h>
+
+#include <gtest/gtest.h>
+
+#include "KVXColumnInfo.h"
+
+#include <string>
+#include <vector>
+
+namespace {
+
+std::vector<BYTE> BytesOf(KVXColumnInfo& record)
+{
+    CMemFile file;
+    record.Write(&file);
+    std::vector<BYTE> bytes(static_cast<size_t>(file.GetLength()));
+    file.SeekToBegin();
+    file.Read(bytes.data(), static_cast<UINT>(bytes.size()));
+    return bytes;
+}
+
+void ReadFrom(std::vector<BYTE> bytes, KVXColumnInfo& record)
+{
+    CMemFile file(bytes.data(), static_cast<UINT>(bytes.size()));
+    record.Read(&file);
+}
+
+std::wstring Title(const KVXColumnInfo& record)
+{
+    return std::wstring(static_cast<LPCTSTR>(record.GetTitle()));
+}
+
+// The titled example: "Name", index 2, sub-item 5, width 120, format 0, sort type 3.
+void MakeNameRecord(KVXColumnInfo& record)
+{
+    record = KVXColumnInfo(2, _T("Name"), 5, 120, 0);
+    record.SetSortType(3);
+}
+
+TEST(ColumnInfoTest, ByteImagesOfTheExampleRecords)
+{
+    KVXColumnInfo empty;
+    EXPECT_EQ((std::vector<BYTE>{ 0, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0, 0, 0, 0, 0, 0, 0, 0, 0 }),
+        BytesOf(empty));
+
+    KVXColumnInfo name;
+    MakeNameRecord(name);
+    EXPECT_EQ((std::vector<BYTE>{ 'N', 'a', 'm', 'e', 0, 2, 0, 0, 0, 5, 0, 0, 0, 0x78, 0, 0, 0, 0, 0, 0, 0, 3 }),
+        BytesOf(name));
+}
+
+TEST(ColumnInfoTest, ReadBackIntoFreshRecords)
+{
+    KVXColumnInfo empty;
+    KVXColumnInfo emptyBack;
+    ReadFrom(BytesOf(empty), emptyBack);
+    EXPECT_EQ(L"", Title(emptyBack));
+    EXPECT_EQ(-1, emptyBack.GetIndex());
+    EXPECT_EQ(-1, emptyBack.GetSubItem());
+    EXPECT_EQ(0, emptyBack.GetWidth());
+    EXPECT_EQ(0, emptyBack.GetFormat());
+    EXPECT_EQ(0, emptyBack.GetSortType());
+
+    // The drag payload: the record, then the flag byte, which the reader takes after it.
+    KVXColumnInfo name;
+    MakeNameRecord(name);
+    CMemFile payload;
+    name.Write(&payload);
+    const BYTE flag = 1;
+    payload.Write(&flag, 1);
+    EXPECT_EQ(23u, payload.GetLength());
+    payload.SeekToBegin();
+    KVXColumnInfo back;
+    back.Read(&payload);
+    BYTE flagBack = 0;
+    EXPECT_EQ(1u, payload.Read(&flagBack, 1));
+    EXPECT_EQ(1, flagBack);
+    EXPECT_EQ(L"Name", Title(back));
+    EXPECT_EQ(2, back.GetIndex());
+    EXPECT_EQ(5, back.GetSubItem());
+    EXPECT_EQ(120, back.GetWidth());
+    EXPECT_EQ(3, back.GetSortType());
+}
+
+TEST(ColumnInfoTest, TitlesKeepOneBytePerCharacter)
+{
+    std::wstring ascii;
+    for (wchar_t c = 0x20; c < 0x7F; ++c)
+        ascii += c;
+    KVXColumnInfo record(0, ascii.c_str(), 0, 10, LVCFMT_LEFT);
+    const std::vector<BYTE> bytes = BytesOf(record);
+    ASSERT_EQ(ascii.size() + 18, bytes.size());
+    EXPECT_EQ(std::string(ascii.begin(), ascii.end()), std::string(bytes.begin(), bytes.begin() + ascii.size()));
+    KVXColumnInfo back;
+    ReadFrom(bytes, back);
+    EXPECT_EQ(ascii, Title(back));
+
+    // A character the single-byte code page lacks is stored as '?'; the length holds.
+    KVXColumnInfo greek(0, L"\x03A9 \x00E9t\x00E9", 0, 10, LVCFMT_LEFT);
+    const std::vector<BYTE> greekBytes = BytesOf(greek);
+    ASSERT_EQ(5u + 18u, greekBytes.size());
+    KVXColumnInfo greekBack;
+    ReadFrom(greekBytes, greekBack);
+    EXPECT_EQ(L"? \x00E9t\x00E9", Title(greekBack));
+}
+
+TEST(ColumnInfoTest, AssignmentCopiesEveryField)
+{
+    KVXColumnInfo source(4, _T("Size"), 7, 80, LVCFMT_RIGHT);
+    source.SetSortType(2);
+    KVXColumnInfo target;
+    target = source;
+    EXPECT_EQ(L"Size", Title(target));
+    EXPECT_EQ(4, target.GetIndex());
+    EXPECT_EQ(7, target.GetSubItem());
+    EXPECT_EQ(80, target.GetWidth());
+    EXPECT_EQ(LVCFMT_RIGHT, target.GetFormat());
+    EXPECT_EQ(2, target.GetSortType());
+}
+
+TEST(ColumnInfoTest, TruncatedStreamsStopAtTheEnd)
+{
+    KVXColumnInfo source(2, _T("Name"), 5, 120, LVCFMT_RIGHT);
+    source.SetSortType(3);
+    const std::vector<BYTE> full = BytesOf(source);
+    // Where each field ends in the record; a field cut short keeps the fresh value.
+    for (size_t length = 0; length < full.size(); ++length)
+    {
+        SCOPED_TRACE(testing::Message() << "bytes " << length);
+        KVXColumnInfo back;
+        ReadFrom(std::vector<BYTE>(full.begin(), full.begin() + length), back);
+        EXPECT_EQ(std::wstring(L"Name").substr(0, length), Title(back));
+        EXPECT_EQ(length >= 9 ? 2 : -1, back.GetIndex());
+        EXPECT_EQ(length >= 13 ? 5 : -1, back.GetSubItem());
+        EXPECT_EQ(length >= 17 ? 120 : 0, back.GetWidth());
+        EXPECT_EQ(length >= 21 ? LVCFMT_RIGHT : 0, back.GetFormat());
+        EXPECT_EQ(0, back.GetSortType());
+    }
+}
+
+} // namespace
