@@ -16,13 +16,28 @@ END_MESSAGE_MAP()
 
 namespace {
 
-// During one sort every row's item data points at its record.
+// During one sort every row's item data points at its record. The rows' key texts
+// (the cell text, or the cell's image index as "%d") lie side by side in one buffer.
 struct SortRecord
 {
     DWORD_PTR dwItemData;   // the row's own item data, restored after the sort
-    CString strKey;         // the cell text, or the cell's image index as "%d"
+    size_t nKeyStart;       // where the row's key text starts in the buffer
     int nRank;              // the row's place in the sorted order
 };
+
+// Every row that holds one of the records gets its own item data back.
+void RestoreItemData(CListCtrl& list, const std::vector<SortRecord>& records)
+{
+    const uintptr_t first = reinterpret_cast<uintptr_t>(records.data());
+    const uintptr_t end = first + records.size() * sizeof(SortRecord);
+    const int nRows = list.GetItemCount();
+    for (int i = 0; i < nRows; ++i)
+    {
+        const uintptr_t data = static_cast<uintptr_t>(list.GetItemData(i));
+        if (data >= first && data < end && (data - first) % sizeof(SortRecord) == 0)
+            list.SetItemData(i, reinterpret_cast<const SortRecord*>(data)->dwItemData);
+    }
+}
 
 // Key texts up to this length are fetched without a heap buffer.
 const int kKeyBufferLength = 260;
@@ -196,8 +211,11 @@ void KVXListCtrlEx::SortList(int nColumn, bool bAscending)
     PostSort();
 }
 
-CString KVXListCtrlEx::GetKeyText(int nItem, int nColumn, unsigned char nType) const
+void KVXListCtrlEx::AppendKeyText(int nItem, int nColumn, unsigned char nType, std::vector<TCHAR>& keys) const
 {
+    TCHAR szText[kKeyBufferLength];
+    szText[0] = 0;
+    int nLength;
     if (nType == ListSortKeys::kImage || nType == ListSortKeys::kImageAlt)
     {
         LVITEM item = {};
@@ -205,16 +223,23 @@ CString KVXListCtrlEx::GetKeyText(int nItem, int nColumn, unsigned char nType) c
         item.iItem = nItem;
         item.iSubItem = nColumn;
         GetItem(&item);
-        CString strKey;
-        strKey.Format(_T("%d"), item.iImage);
-        return strKey;
+        nLength = ::wsprintf(szText, _T("%d"), item.iImage);
     }
-    TCHAR szText[kKeyBufferLength];
-    szText[0] = 0;
-    const int nLength = GetItemText(nItem, nColumn, szText, kKeyBufferLength);
-    if (nLength < kKeyBufferLength - 1)
-        return CString(szText, nLength);
-    return GetItemText(nItem, nColumn);
+    else
+    {
+        nLength = GetItemText(nItem, nColumn, szText, kKeyBufferLength);
+    }
+    if (nLength >= 0 && nLength < kKeyBufferLength - 1)
+    {
+        keys.insert(keys.end(), szText, szText + nLength);
+    }
+    else
+    {
+        // The text filled the buffer: it may be longer.
+        const CString strText = GetItemText(nItem, nColumn);
+        keys.insert(keys.end(), static_cast<LPCTSTR>(strText), static_cast<LPCTSTR>(strText) + strText.GetLength());
+    }
+    keys.push_back(0);
 }
 
 void KVXListCtrlEx::SortRows(int nColumn, bool bAscending)
@@ -225,15 +250,18 @@ void KVXListCtrlEx::SortRows(int nColumn, bool bAscending)
     // Every key is fetched and parsed once; the rows are ordered here and the list
     // view only applies that order, comparing ranks.
     std::vector<SortRecord> records(static_cast<size_t>(nCount));
-    std::vector<LPCWSTR> texts(static_cast<size_t>(nCount));
+    std::vector<TCHAR> keys;
+    keys.reserve(static_cast<size_t>(nCount) * 16);
     for (int i = 0; i < nCount; ++i)
     {
         records[i].dwItemData = GetItemData(i);
-        records[i].strKey = GetKeyText(i, nColumn, nType);
-        texts[i] = records[i].strKey;
+        records[i].nKeyStart = keys.size();
+        AppendKeyText(i, nColumn, nType, keys);
     }
-    const std::vector<int> order = ListSortKeys::SortOrder(nType,
-        ListSortKeys::MakeSortKeys(nType, texts, m_dtBaseTime), bAscending);
+    std::vector<LPCWSTR> texts(static_cast<size_t>(nCount));
+    for (int i = 0; i < nCount; ++i)
+        texts[i] = keys.data() + records[i].nKeyStart;
+    const std::vector<int> order = ListSortKeys::SortKeys(nType, texts, m_dtBaseTime).Order(bAscending);
     for (int k = 0; k < nCount; ++k)
         records[order[k]].nRank = k;
 
@@ -247,17 +275,28 @@ void KVXListCtrlEx::SortRows(int nColumn, bool bAscending)
     int nWritten = 0;
     while (nWritten < nCount && SetItemData(nWritten, reinterpret_cast<DWORD_PTR>(&records[nWritten])))
         ++nWritten;
+    bool bSorted = false;
     if (nWritten == nCount && GetItemCount() == nCount)
-        SortItems(&KVXListCtrlEx::Compare, (static_cast<DWORD_PTR>(nType) << 8) | (bAscending ? 1 : 0));
+        bSorted = SortItems(&KVXListCtrlEx::Compare, (static_cast<DWORD_PTR>(nType) << 8) | (bAscending ? 1 : 0)) != FALSE;
 
-    const uintptr_t first = reinterpret_cast<uintptr_t>(records.data());
-    const uintptr_t end = first + records.size() * sizeof(SortRecord);
-    const int nRows = GetItemCount();
-    for (int i = 0; i < nRows; ++i)
+    // With distinct ranks one order is possible: row k holds the record of rank k, or,
+    // unsorted, the record it was given. A few rows confirm it before it is relied on.
+    const int nRestore = bSorted ? nCount : nWritten;
+    auto recordAt = [&](int i) -> const SortRecord& { return bSorted ? records[order[i]] : records[i]; };
+    bool bAsExpected = GetItemCount() == nCount;
+    for (int i : { 0, nRestore / 2, nRestore - 1 })
     {
-        const uintptr_t data = static_cast<uintptr_t>(GetItemData(i));
-        if (data >= first && data < end && (data - first) % sizeof(SortRecord) == 0)
-            SetItemData(i, reinterpret_cast<const SortRecord*>(data)->dwItemData);
+        if (bAsExpected && i >= 0 && i < nRestore)
+            bAsExpected = GetItemData(i) == reinterpret_cast<DWORD_PTR>(&recordAt(i));
+    }
+    if (bAsExpected)
+    {
+        for (int i = 0; i < nRestore; ++i)
+            SetItemData(i, recordAt(i).dwItemData);
+    }
+    else
+    {
+        RestoreItemData(*this, records);
     }
 
     if (bSuspendRedraw)

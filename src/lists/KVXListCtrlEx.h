@@ -10,6 +10,8 @@
 
 #include "KVXHeaderCtrlEx.h"
 
+#include <vector>
+
 class AFX_EXT_CLASS KVXListCtrlEx : public CListCtrl
 {
 // Constructors
@@ -71,6 +73,7 @@ protected:
 private:
     void SubclassHeader();
     unsigned char GetColumnType(int nColumn) const;
-    CString GetKeyText(int nItem, int nColumn, unsigned char nType) const;
+    // Appends the row's key text for a column of the type, and a terminating zero.
+    void AppendKeyText(int nItem, int nColumn, unsigned char nType, std::vector<TCHAR>& keys) const;
     void SortRows(int nColumn, bool bAscending);
 };

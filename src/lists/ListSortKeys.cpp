@@ -7,6 +7,7 @@
 #include <string>
 #include <string_view>
 #include <unordered_map>
+#include <wctype.h>
 #include <wchar.h>
 
 namespace ListSortKeys {
@@ -49,18 +50,30 @@ int Sign(T a, T b)
 
 } // namespace
 
-std::vector<SortKey> MakeSortKeys(unsigned char type, const std::vector<LPCWSTR>& texts,
-    const COleDateTime& baseTime)
+SortKeys::SortKeys(unsigned char type, const std::vector<LPCWSTR>& texts, const COleDateTime& baseTime)
+    : m_type(type), m_keys(texts.size(), Key{ L"", 0.0, true })
 {
-    std::vector<SortKey> keys(texts.size(), SortKey{ L"", 0.0, true });
+    if (type == kTextNoCase)
+    {
+        m_folded.resize(texts.size());
+        for (size_t i = 0; i < texts.size(); ++i)
+        {
+            m_folded[i] = texts[i] != NULL ? texts[i] : L"";
+            for (wchar_t& ch : m_folded[i])
+                ch = towlower(ch);
+            m_keys[i].text = m_folded[i].c_str();
+        }
+        return;
+    }
+
     const bool bShift = type == kTimeOfDay && baseTime.GetStatus() == COleDateTime::valid;
     const COleDateTimeSpan oneDay(1, 0, 0, 0);
     // The platform's parser is slow; sorted columns repeat many of their texts.
-    std::unordered_map<std::wstring_view, SortKey> parsed;
+    std::unordered_map<std::wstring_view, Key> parsed;
     for (size_t i = 0; i < texts.size(); ++i)
     {
         LPCWSTR text = texts[i] != NULL ? texts[i] : L"";
-        SortKey& key = keys[i];
+        Key& key = m_keys[i];
         key.text = text;
         switch (type)
         {
@@ -78,8 +91,7 @@ std::vector<SortKey> MakeSortKeys(unsigned char type, const std::vector<LPCWSTR>
             auto found = parsed.find(text);
             if (found != parsed.end())
             {
-                key.value = found->second.value;
-                key.valid = found->second.valid;
+                key = found->second;
                 break;
             }
             COleDateTime date;
@@ -94,43 +106,42 @@ std::vector<SortKey> MakeSortKeys(unsigned char type, const std::vector<LPCWSTR>
             break;
         }
     }
-    return keys;
 }
 
-int CompareSortKeys(unsigned char type, const SortKey& a, const SortKey& b)
+int SortKeys::Compare(int a, int b) const
 {
-    switch (type)
+    const Key& keyA = m_keys[a];
+    const Key& keyB = m_keys[b];
+    switch (m_type)
     {
     case kText:
-        return Sign(wcscmp(a.text, b.text), 0);
     case kTextNoCase:
-        return Sign(_wcsicmp(a.text, b.text), 0);
+        return Sign(wcscmp(keyA.text, keyB.text), 0);
     case kInteger:
     case kFloat:
     case kImage:
     case kImageAlt:
-        return Sign(a.value, b.value);
+        return Sign(keyA.value, keyB.value);
     case kDate:
     case kTimeOfDay:
-        return a.valid && b.valid ? Sign(a.value, b.value) : 0;
+        return keyA.valid && keyB.valid ? Sign(keyA.value, keyB.value) : 0;
     default:
         return 0;
     }
 }
 
-std::vector<int> SortOrder(unsigned char type, const std::vector<SortKey>& keys, bool bAscending)
+std::vector<int> SortKeys::Order(bool bAscending) const
 {
-    const int n = static_cast<int>(keys.size());
+    const int n = static_cast<int>(m_keys.size());
     std::vector<int> order(static_cast<size_t>(n));
     std::iota(order.begin(), order.end(), 0);
-    if (type == kNotSortable || type > kLastColumnType)
+    if (m_type == kNotSortable || m_type > kLastColumnType)
         return order;
 
-    auto before = [&](int a, int b) {
-        return bAscending ? CompareSortKeys(type, keys[a], keys[b]) < 0
-                          : CompareSortKeys(type, keys[b], keys[a]) < 0;
+    auto before = [this, bAscending](int a, int b) {
+        return bAscending ? Compare(a, b) < 0 : Compare(b, a) < 0;
     };
-    if (!IsDateType(type))
+    if (!IsDateType(m_type))
     {
         std::stable_sort(order.begin(), order.end(), before);
         return order;
@@ -141,7 +152,7 @@ std::vector<int> SortOrder(unsigned char type, const std::vector<SortKey>& keys,
     std::vector<int> places;
     for (int i = 0; i < n; ++i)
     {
-        if (keys[i].valid)
+        if (m_keys[i].valid)
             places.push_back(i);
     }
     std::vector<int> dated = places;

@@ -13,6 +13,7 @@
 #include <afx.h>
 #include <afxdisp.h>
 
+#include <string>
 #include <vector>
 
 namespace ListSortKeys {
@@ -35,26 +36,38 @@ constexpr unsigned char kLastColumnType = kImageAlt;
 // type of a column record, case-sensitive text.
 constexpr unsigned char kDefaultColumnType = kText;
 
-struct SortKey
+// The keys of one column's rows, each parsed once from its key text.
+class SortKeys
 {
-    LPCWSTR text;   // the key text, for the text rules; it must outlive the key
-    double value;   // integer, float, or a date as a linear count of days
-    bool valid;     // date rules: the text is a date (or time)
+public:
+    // The base time of type 6: a time before it counts one day later. Not valid: no
+    // shift. Dates are parsed with ParseDateTime (no flags, LANG_USER_DEFAULT), each
+    // distinct text once. The texts must outlive the keys.
+    SortKeys(unsigned char type, const std::vector<LPCWSTR>& texts, const COleDateTime& baseTime);
+
+    // The rule before the direction for rows a and b: negative, 0 or positive. A text
+    // that is no date compares equal to every row; so do all rows of type 4 and of
+    // unknown types.
+    int Compare(int a, int b) const;
+
+    // order[k] is the row that goes to place k. Rows that compare equal keep their
+    // order in both directions; rows whose text is no date keep their places, and the
+    // dated rows are ordered among themselves in the other places.
+    std::vector<int> Order(bool bAscending) const;
+
+private:
+    struct Key
+    {
+        LPCWSTR text;   // the text rules; type 1: folded to lower case
+        double value;   // integer, float, or a date as a linear count of days
+        bool valid;     // date rules: the text is a date (or time)
+    };
+
+    unsigned char m_type;
+    std::vector<Key> m_keys;
+    // _wcsicmp compares the characters folded by towlower: folded once per row, the
+    // texts compare alike with wcscmp.
+    std::vector<std::wstring> m_folded;
 };
-
-// The base time of type 6: a time before it counts one day later. Not valid: no shift.
-// Texts are parsed with ParseDateTime (no flags, LANG_USER_DEFAULT), each distinct
-// text once.
-std::vector<SortKey> MakeSortKeys(unsigned char type, const std::vector<LPCWSTR>& texts,
-    const COleDateTime& baseTime);
-
-// The rule before the direction: negative, 0 or positive. Texts that are no dates
-// compare equal to every key; so do all keys of type 4 and of unknown types.
-int CompareSortKeys(unsigned char type, const SortKey& a, const SortKey& b);
-
-// order[k] is the row that goes to place k. Keys that compare equal keep their
-// order in both directions; rows whose text is no date keep their places, and the
-// dated rows are ordered among themselves in the other places.
-std::vector<int> SortOrder(unsigned char type, const std::vector<SortKey>& keys, bool bAscending);
 
 } // namespace ListSortKeys

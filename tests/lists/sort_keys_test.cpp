@@ -34,6 +34,7 @@ const OrderCase kOrderCases[] = {
     { "TextCaseSensitiveCapitalsFirst", kText, { L"beta", L"Beta", L"alpha" }, Asc, NULL, { 1, 2, 0 } },
     { "TextEqualKeepOrder", kText, { L"a", L"b", L"a" }, Desc, NULL, { 1, 0, 2 } },
     { "TextNoCaseEqualKeepOrder", kTextNoCase, { L"beta", L"Alpha", L"BETA", L"alpha" }, Asc, NULL, { 1, 3, 0, 2 } },
+    { "TextNoCaseFoldsToLowerCase", kTextNoCase, { L"AX", L"_x" }, Asc, NULL, { 1, 0 } },   // '_' < 'a'
     { "TextNoCaseDescendingEqualKeepOrder", kTextNoCase, { L"beta", L"Alpha", L"BETA", L"alpha" }, Desc, NULL, { 0, 2, 1, 3 } },
     { "IntegerTenAfterNine", kInteger, { L"10", L"9" }, Asc, NULL, { 1, 0 } },
     { "IntegerLettersCountAsZero", kInteger, { L"3", L"abc", L"-2" }, Asc, NULL, { 2, 1, 0 } },
@@ -68,7 +69,7 @@ TEST_P(SortOrderTest, RowsInOrder)
     {
         ASSERT_TRUE(baseTime.ParseDateTime(c.baseTime));
     }
-    EXPECT_EQ(c.expected, SortOrder(c.type, MakeSortKeys(c.type, c.texts, baseTime), c.ascending));
+    EXPECT_EQ(c.expected, SortKeys(c.type, c.texts, baseTime).Order(c.ascending));
 }
 
 INSTANTIATE_TEST_SUITE_P(Rules, SortOrderTest, testing::ValuesIn(kOrderCases),
