@@ -17,6 +17,8 @@
 #include "Pixels.h"
 
 #include <memory>
+#include <tuple>
+#include <utility>
 #include <sstream>
 #include <string>
 
@@ -27,18 +29,9 @@ namespace {
 // ---------------------------------------------------------------------------------
 // Geometry
 
-struct ArrowCase
-{
-    const char* name;
-    RECT column;
-    int textWidth;
-    bool rightAligned;
-    bool ascending;
-    bool visible;
-    int x0;
-    int apexY;
-    int baseY;
-};
+// Input: the column's edges, the title's width and alignment, the direction; then the arrow.
+struct ArrowCase { const char* name; RECT column; int textWidth; bool rightAligned; bool ascending;
+                   bool visible; int x0; int apexY; int baseY; };
 
 const ArrowCase kArrowCases[] = {
     // Inside the 3-pixel margin: left 103, right 197, top 3, bottom 17.
@@ -57,11 +50,8 @@ TEST_P(SortArrowTest, Placement)
 {
     const ArrowCase& c = GetParam();
     const SortArrow arrow = PlaceSortArrow(c.column, c.textWidth, c.rightAligned, c.ascending);
-    EXPECT_EQ(c.visible, arrow.visible);
-    EXPECT_EQ(c.x0, arrow.x0);
-    EXPECT_EQ(c.x0 + 4, arrow.apexX);
-    EXPECT_EQ(c.apexY, arrow.apexY);
-    EXPECT_EQ(c.baseY, arrow.baseY);
+    EXPECT_EQ(testing::PrintToString(std::make_tuple(c.visible, c.x0, c.x0 + 4, c.apexY, c.baseY)),
+        testing::PrintToString(std::make_tuple(arrow.visible, arrow.x0, arrow.apexX, arrow.apexY, arrow.baseY)));
 }
 
 INSTANTIATE_TEST_SUITE_P(Cases, SortArrowTest, testing::ValuesIn(kArrowCases),
@@ -78,8 +68,7 @@ TEST(DropPositionTest, ItemUnderThePointerOrTheEnd)
     for (const auto& c : cases)
     {
         const DropPosition drop = FindDropPosition(c.x, widths, 4);
-        EXPECT_EQ(c.position, drop.position) << "x " << c.x;
-        EXPECT_EQ(c.edge, drop.edge) << "x " << c.x;
+        EXPECT_EQ(std::make_pair(c.position, c.edge), std::make_pair(drop.position, drop.edge)) << "x " << c.x;
     }
     EXPECT_EQ(0, FindDropPosition(10, widths, 0).position);
 }
@@ -95,9 +84,7 @@ class CDragRecorder : public CWnd
 public:
     void OnColumnDragged(int nItem, int nPosition)
     {
-        std::ostringstream s;
-        s << "(" << nItem << "," << nPosition << ")";
-        m_trace += s.str();
+        m_trace += "(" + std::to_string(nItem) + "," + std::to_string(nPosition) + ")";
     }
     std::string m_trace;
 };
@@ -110,10 +97,16 @@ protected:
         m_host.reset(new orvane_test::HostWindow(600, 200));
         ASSERT_TRUE(m_header.Create(WS_CHILD | WS_VISIBLE | HDS_HORZ | HDS_BUTTONS, CRect(0, 0, 560, 24),
             CWnd::FromHandle(*m_host), 10));
-        AddItem(kTitles[0], 120, HDF_LEFT);
-        AddItem(kTitles[1], 100, HDF_RIGHT);
-        AddItem(kTitles[2], TitleWidth(kTitles[2]) + 12, HDF_LEFT);
-        AddItem(kTitles[3], 100, HDF_LEFT);
+        const int widths[] = { 120, 100, TitleWidth(kTitles[2]) + 12, 100 };
+        for (int i = 0; i < 4; ++i)
+        {
+            HDITEM item = {};
+            item.mask = HDI_TEXT | HDI_WIDTH | HDI_FORMAT;
+            item.pszText = const_cast<LPTSTR>(kTitles[i]);
+            item.cxy = widths[i];
+            item.fmt = (i == 1 ? HDF_RIGHT : HDF_LEFT) | HDF_STRING;
+            m_header.InsertItem(i, &item);
+        }
         m_header.SetCallback(&m_recorder, static_cast<void (CWnd::*)(int, int)>(&CDragRecorder::OnColumnDragged));
     }
 
@@ -121,16 +114,6 @@ protected:
     {
         m_header.DestroyWindow();
         m_host.reset();
-    }
-
-    void AddItem(LPCTSTR title, int width, int format)
-    {
-        HDITEM item = {};
-        item.mask = HDI_TEXT | HDI_WIDTH | HDI_FORMAT;
-        item.pszText = const_cast<LPTSTR>(title);
-        item.cxy = width;
-        item.fmt = format | HDF_STRING;
-        m_header.InsertItem(m_header.GetItemCount(), &item);
     }
 
     // Measured like the header measures: in its client DC as it comes.
@@ -150,11 +133,6 @@ protected:
         return rc;
     }
 
-    int ItemCenter(int item)
-    {
-        return ItemRect(item).CenterPoint().x;
-    }
-
     std::unique_ptr<orvane_test::HostWindow> m_host;
     KVXHeaderCtrlEx m_header;
     CDragRecorder m_recorder;
@@ -163,13 +141,7 @@ protected:
 // ---------------------------------------------------------------------------------
 // The indicator as painted
 
-struct PaintCase
-{
-    const char* name;
-    int column;
-    bool ascending;
-    bool drawn;
-};
+struct PaintCase { const char* name; int column; bool ascending; bool drawn; };
 
 const PaintCase kPaintCases[] = {
     { "Ascending", 0, true, true },
@@ -185,21 +157,15 @@ const PaintCase kPaintCases[] = {
 class EdgeColorsGuard
 {
 public:
-    EdgeColorsGuard()
+    EdgeColorsGuard() : m_saved{ ::GetSysColor(COLOR_3DDKSHADOW), ::GetSysColor(COLOR_3DHILIGHT) }
     {
-        const INT elements[2] = { COLOR_3DDKSHADOW, COLOR_3DHILIGHT };
         const COLORREF colors[2] = { RGB(128, 0, 0), RGB(0, 160, 0) };
-        m_saved[0] = ::GetSysColor(COLOR_3DDKSHADOW);
-        m_saved[1] = ::GetSysColor(COLOR_3DHILIGHT);
-        ::SetSysColors(2, elements, colors);
+        ::SetSysColors(2, kElements, colors);
     }
-    ~EdgeColorsGuard()
-    {
-        const INT elements[2] = { COLOR_3DDKSHADOW, COLOR_3DHILIGHT };
-        ::SetSysColors(2, elements, m_saved);
-    }
+    ~EdgeColorsGuard() { ::SetSysColors(2, kElements, m_saved); }
 
 private:
+    static constexpr INT kElements[2] = { COLOR_3DDKSHADOW, COLOR_3DHILIGHT };
     COLORREF m_saved[2];
 };
 
@@ -244,13 +210,8 @@ INSTANTIATE_TEST_SUITE_P(Cases, SortIndicatorPaintTest, testing::ValuesIn(kPaint
 // Column dragging. Steps: dN press on item N, mN move there with the button held,
 // hN move there without a button, uN release there; E is right of the last item.
 
-struct DragCase
-{
-    const char* name;
-    const char* steps;
-    bool enabled;
-    const char* trace;      // the callback's calls
-};
+// trace: the callback's calls.
+struct DragCase { const char* name; const char* steps; bool enabled; const char* trace; };
 
 // The first move with the button held starts the drag; later moves mark positions.
 const DragCase kDragCases[] = {
@@ -277,7 +238,7 @@ TEST_P(ColumnDragTest, Callbacks)
     std::string step;
     while (steps >> step)
     {
-        const int x = step[1] == 'E' ? ItemRect(3).right + 10 : ItemCenter(step[1] - '0');
+        const int x = step[1] == 'E' ? ItemRect(3).right + 10 : ItemRect(step[1] - '0').CenterPoint().x;
         switch (step[0])
         {
         case 'd': m_header.SendMessage(WM_LBUTTONDOWN, MK_LBUTTON, orvane_test::PointParam(x, y)); break;

@@ -17,15 +17,9 @@ using namespace ListSortKeys;
 
 namespace {
 
-struct OrderCase
-{
-    const char* name;
-    unsigned char type;
-    std::vector<LPCWSTR> texts;
-    bool ascending;
-    LPCWSTR baseTime;           // NULL: no valid base time
-    std::vector<int> expected;  // the rows in sorted order
-};
+// baseTime NULL: no valid base time; expected: the rows in sorted order.
+struct OrderCase { const char* name; unsigned char type; std::vector<LPCWSTR> texts; bool ascending;
+                   LPCWSTR baseTime; std::vector<int> expected; };
 
 const bool Asc = true;
 const bool Desc = false;
