@@ -4,7 +4,6 @@
 #include "ListSortKeys.h"
 
 #include <new>
-#include <stdint.h>
 #include <vector>
 
 BEGIN_MESSAGE_MAP(KVXListCtrlEx, CListCtrl)
@@ -16,28 +15,13 @@ END_MESSAGE_MAP()
 
 namespace {
 
-// During one sort every row's item data points at its record. The rows' key texts
-// (the cell text, or the cell's image index as "%d") lie side by side in one buffer.
+// What one sort keeps of every row. The rows' key texts (the cell text, or the cell's
+// image index as "%d") lie side by side in one buffer.
 struct SortRecord
 {
     DWORD_PTR dwItemData;   // the row's own item data, restored after the sort
     size_t nKeyStart;       // where the row's key text starts in the buffer
-    int nRank;              // the row's place in the sorted order
 };
-
-// Every row that holds one of the records gets its own item data back.
-void RestoreItemData(CListCtrl& list, const std::vector<SortRecord>& records)
-{
-    const uintptr_t first = reinterpret_cast<uintptr_t>(records.data());
-    const uintptr_t end = first + records.size() * sizeof(SortRecord);
-    const int nRows = list.GetItemCount();
-    for (int i = 0; i < nRows; ++i)
-    {
-        const uintptr_t data = static_cast<uintptr_t>(list.GetItemData(i));
-        if (data >= first && data < end && (data - first) % sizeof(SortRecord) == 0)
-            list.SetItemData(i, reinterpret_cast<const SortRecord*>(data)->dwItemData);
-    }
-}
 
 // Key texts up to this length are fetched without a heap buffer.
 const int kKeyBufferLength = 260;
@@ -262,8 +246,9 @@ void KVXListCtrlEx::SortRows(int nColumn, bool bAscending)
     for (int i = 0; i < nCount; ++i)
         texts[i] = keys.data() + records[i].nKeyStart;
     const std::vector<int> order = ListSortKeys::SortKeys(nType, texts, m_dtBaseTime).Order(bAscending);
+    std::vector<int> ranks(static_cast<size_t>(nCount));
     for (int k = 0; k < nCount; ++k)
-        records[order[k]].nRank = k;
+        ranks[order[k]] = k;
 
     // Each item data write repaints a visible row while drawing is on; the order
     // shows once drawing resumes.
@@ -271,32 +256,33 @@ void KVXListCtrlEx::SortRows(int nColumn, bool bAscending)
     if (bSuspendRedraw)
         SetRedraw(FALSE);
 
-    // The parent may refuse a change (LVN_ITEMCHANGING): then no record may reach Compare.
+    // During the sort every row's item data is its rank. The parent may refuse a
+    // change (LVN_ITEMCHANGING): then nothing is sorted and the rows written get
+    // their own data back.
     int nWritten = 0;
-    while (nWritten < nCount && SetItemData(nWritten, reinterpret_cast<DWORD_PTR>(&records[nWritten])))
+    while (nWritten < nCount && SetItemData(nWritten, static_cast<DWORD_PTR>(ranks[nWritten])))
         ++nWritten;
     bool bSorted = false;
     if (nWritten == nCount && GetItemCount() == nCount)
         bSorted = SortItems(&KVXListCtrlEx::Compare, (static_cast<DWORD_PTR>(nType) << 8) | (bAscending ? 1 : 0)) != FALSE;
-
-    // With distinct ranks one order is possible: row k holds the record of rank k, or,
-    // unsorted, the record it was given. A few rows confirm it before it is relied on.
-    const int nRestore = bSorted ? nCount : nWritten;
-    auto recordAt = [&](int i) -> const SortRecord& { return bSorted ? records[order[i]] : records[i]; };
-    bool bAsExpected = GetItemCount() == nCount;
-    for (int i : { 0, nRestore / 2, nRestore - 1 })
+    if (!bSorted)
     {
-        if (bAsExpected && i >= 0 && i < nRestore)
-            bAsExpected = GetItemData(i) == reinterpret_cast<DWORD_PTR>(&recordAt(i));
-    }
-    if (bAsExpected)
-    {
-        for (int i = 0; i < nRestore; ++i)
-            SetItemData(i, recordAt(i).dwItemData);
+        for (int i = 0; i < nWritten && i < GetItemCount(); ++i)
+            SetItemData(i, records[i].dwItemData);
     }
     else
     {
-        RestoreItemData(*this, records);
+        // The ranks are distinct, so one order is possible: row k holds rank k. Should
+        // a few rows say otherwise, every row is read.
+        bool bAsExpected = true;
+        for (int k : { 0, nCount / 2, nCount - 1 })
+            bAsExpected = bAsExpected && (k < 0 || GetItemData(k) == static_cast<DWORD_PTR>(k));
+        for (int k = 0; k < nCount; ++k)
+        {
+            const DWORD_PTR nRank = bAsExpected ? static_cast<DWORD_PTR>(k) : GetItemData(k);
+            if (nRank < static_cast<DWORD_PTR>(nCount))
+                SetItemData(k, records[order[nRank]].dwItemData);
+        }
     }
 
     if (bSuspendRedraw)
@@ -310,9 +296,7 @@ int CALLBACK KVXListCtrlEx::Compare(LPARAM lParam1, LPARAM lParam2, LPARAM)
 {
     // The ranks hold the column's rule and direction already, and keep equal keys in
     // their previous order.
-    const int nRank1 = reinterpret_cast<const SortRecord*>(lParam1)->nRank;
-    const int nRank2 = reinterpret_cast<const SortRecord*>(lParam2)->nRank;
-    return nRank1 < nRank2 ? -1 : (nRank1 > nRank2 ? 1 : 0);
+    return lParam1 < lParam2 ? -1 : (lParam1 > lParam2 ? 1 : 0);
 }
 
 /////////////////////////////////////////////////////////////////////////////

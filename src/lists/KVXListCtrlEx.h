@@ -46,8 +46,9 @@ public:
 
 // Implementation
 protected:
-    // The LVM_SORTITEMS callback over the rows' sort records; lParamSort is the
-    // column type code times 256 plus the direction (1 ascending).
+    // The LVM_SORTITEMS callback: during a sort every row's item data is its rank in
+    // the order the column's rule gives. lParamSort is the column type code times 256
+    // plus the direction (1 ascending).
     static int CALLBACK Compare(LPARAM lParam1, LPARAM lParam2, LPARAM lParamSort);
     // The header's drag callback: moves column nSource before position nTarget (or
     // to the end when nTarget is the column count), cell texts included.
