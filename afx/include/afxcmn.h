@@ -1,4 +1,5 @@
-// afxcmn.h - wrappers of the common controls: image lists and the tree view.
+// afxcmn.h - wrappers of the common controls: image lists, the tree view, the
+// header and the list view.
 // Each wrapper is a thin layer over the control's messages; the results are the
 // control's own.
 #pragma once
@@ -19,6 +20,8 @@
 
 class CImageList;
 class CTreeCtrl;
+class CHeaderCtrl;
+class CListCtrl;
 
 /////////////////////////////////////////////////////////////////////////////
 // CImageList: owns an image list handle (destroyed with the object unless detached)
@@ -180,6 +183,137 @@ public:
     virtual ~CTreeCtrl();
 protected:
     afx_msg void OnDestroy();
+    DECLARE_MESSAGE_MAP()
+};
+
+/////////////////////////////////////////////////////////////////////////////
+// CHeaderCtrl: the header control (also the column header of a list view)
+
+class CHeaderCtrl : public CWnd
+{
+    DECLARE_DYNAMIC(CHeaderCtrl)
+
+// Constructors
+public:
+    CHeaderCtrl();
+    virtual BOOL Create(DWORD dwStyle, const RECT& rect, CWnd* pParentWnd, UINT nID);
+    virtual BOOL CreateEx(DWORD dwExStyle, DWORD dwStyle, const RECT& rect, CWnd* pParentWnd, UINT nID);
+
+// Attributes
+    int GetItemCount() const;
+    BOOL GetItem(int nPos, HDITEM* pHeaderItem) const;
+    BOOL SetItem(int nPos, HDITEM* pHeaderItem);
+    CImageList* GetImageList() const;
+    CImageList* SetImageList(CImageList* pImageList);
+    BOOL GetItemRect(int nIndex, LPRECT lpRect) const;
+    // iCount -1: the header's own item count.
+    BOOL GetOrderArray(LPINT piArray, int iCount = -1);
+    BOOL SetOrderArray(int iCount, LPINT piArray);
+    int OrderToIndex(int nOrder) const;
+
+// Operations
+    int InsertItem(int nPos, HDITEM* phdi);
+    BOOL DeleteItem(int nPos);
+    BOOL Layout(HDLAYOUT* pHeaderLayout);
+    int HitTest(LPHDHITTESTINFO pHeaderHitTestInfo);
+
+// Overridables (for owner draw only)
+    virtual void DrawItem(LPDRAWITEMSTRUCT lpDrawItemStruct);
+
+// Implementation
+public:
+    virtual ~CHeaderCtrl();
+protected:
+    virtual BOOL OnChildNotify(UINT, WPARAM, LPARAM, LRESULT*);
+};
+
+/////////////////////////////////////////////////////////////////////////////
+// CListCtrl: the list-view control
+
+class CListCtrl : public CWnd
+{
+    DECLARE_DYNAMIC(CListCtrl)
+
+// Constructors
+public:
+    CListCtrl();
+    virtual BOOL Create(DWORD dwStyle, const RECT& rect, CWnd* pParentWnd, UINT nID);
+    virtual BOOL CreateEx(DWORD dwExStyle, DWORD dwStyle, const RECT& rect, CWnd* pParentWnd, UINT nID);
+
+// Attributes
+    COLORREF GetBkColor() const;
+    BOOL SetBkColor(COLORREF cr);
+    COLORREF GetTextColor() const;
+    BOOL SetTextColor(COLORREF cr);
+    CImageList* GetImageList(int nImageList) const;
+    CImageList* SetImageList(CImageList* pImageList, int nImageListType);
+    int GetItemCount() const;
+    BOOL GetItem(LVITEM* pItem) const;
+    BOOL SetItem(const LVITEM* pItem);
+    BOOL SetItem(int nItem, int nSubItem, UINT nMask, LPCTSTR lpszItem, int nImage, UINT nState,
+        UINT nStateMask, LPARAM lParam);
+    int GetNextItem(int nItem, int nFlags) const;
+    BOOL GetItemRect(int nItem, LPRECT lpRect, UINT nCode) const;
+    BOOL GetSubItemRect(int iItem, int iSubItem, int nArea, CRect& ref) const;
+    int GetStringWidth(LPCTSTR lpsz) const;
+    CEdit* GetEditControl() const;
+    BOOL GetColumn(int nCol, LVCOLUMN* pColumn) const;
+    BOOL SetColumn(int nCol, const LVCOLUMN* pColumn);
+    int GetColumnWidth(int nCol) const;
+    BOOL SetColumnWidth(int nCol, int cx);
+    int GetTopIndex() const;
+    int GetCountPerPage() const;
+    BOOL SetItemState(int nItem, LVITEM* pItem);
+    BOOL SetItemState(int nItem, UINT nState, UINT nMask);
+    UINT GetItemState(int nItem, UINT nMask) const;
+    CString GetItemText(int nItem, int nSubItem) const;
+    // Copies at most nLen - 1 characters; returns the length copied.
+    int GetItemText(int nItem, int nSubItem, LPTSTR lpszText, int nLen) const;
+    BOOL SetItemText(int nItem, int nSubItem, LPCTSTR lpszText);
+    BOOL SetItemData(int nItem, DWORD_PTR dwData);
+    DWORD_PTR GetItemData(int nItem) const;
+    UINT GetSelectedCount() const;
+    CHeaderCtrl* GetHeaderCtrl() const;
+    DWORD GetExtendedStyle() const;
+    DWORD SetExtendedStyle(DWORD dwNewStyle);
+    // Check boxes are the state images 1 (clear) and 2 (checked) of LVS_EX_CHECKBOXES.
+    BOOL GetCheck(int nItem) const;
+    BOOL SetCheck(int nItem, BOOL fCheck = TRUE);
+
+// Operations
+    int InsertItem(const LVITEM* pItem);
+    int InsertItem(int nItem, LPCTSTR lpszItem);
+    int InsertItem(int nItem, LPCTSTR lpszItem, int nImage);
+    int InsertItem(UINT nMask, int nItem, LPCTSTR lpszItem, UINT nState, UINT nStateMask,
+        int nImage, LPARAM lParam);
+    BOOL DeleteItem(int nItem);
+    BOOL DeleteAllItems();
+    int FindItem(LVFINDINFO* pFindInfo, int nStart = -1) const;
+    int HitTest(LVHITTESTINFO* pHitTestInfo) const;
+    int HitTest(CPoint pt, UINT* pFlags = NULL) const;
+    BOOL EnsureVisible(int nItem, BOOL bPartialOK);
+    BOOL Scroll(CSize size);
+    BOOL RedrawItems(int nFirst, int nLast);
+    BOOL Update(int nItem);
+    CEdit* EditLabel(int nItem);
+    int InsertColumn(int nCol, const LVCOLUMN* pColumn);
+    // nWidth and nSubItem -1: not given to the control.
+    int InsertColumn(int nCol, LPCTSTR lpszColumnHeading, int nFormat = LVCFMT_LEFT,
+        int nWidth = -1, int nSubItem = -1);
+    BOOL DeleteColumn(int nCol);
+    BOOL SortItems(PFNLVCOMPARE pfnCompare, DWORD_PTR dwData);
+
+// Overridables (for owner draw only)
+    virtual void DrawItem(LPDRAWITEMSTRUCT lpDrawItemStruct);
+
+// Implementation
+protected:
+    void RemoveImageList(int nImageList);
+    virtual BOOL OnChildNotify(UINT, WPARAM, LPARAM, LRESULT*);
+public:
+    virtual ~CListCtrl();
+protected:
+    afx_msg void OnNcDestroy();
     DECLARE_MESSAGE_MAP()
 };
 
