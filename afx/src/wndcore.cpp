@@ -231,8 +231,9 @@ LRESULT CALLBACK _AfxCbtFilterHook(int code, WPARAM wParam, LPARAM lParam)
             && lstrcmpi(szClassName, _T("IME")) == 0;
         if (!bIme)
         {
+            // m_pWndInit stays set until the window is subclassed: PreSubclassWindow
+            // tells creation (still set) from subclassing an existing window (NULL).
             CWnd* pWndInit = pThreadState->m_pWndInit;
-            pThreadState->m_pWndInit = NULL;
             if (pWndInit->Attach(hWnd))
             {
                 pWndInit->PreSubclassWindow();
@@ -242,6 +243,7 @@ LRESULT CALLBACK _AfxCbtFilterHook(int code, WPARAM wParam, LPARAM lParam)
                 if (oldWndProc != &AfxWndProc)
                     *pOldWndProc = oldWndProc;
             }
+            pThreadState->m_pWndInit = NULL;
         }
     }
     return ::CallNextHookEx(pThreadState->m_hHookOldCbtFilter, code, wParam, lParam);
@@ -585,8 +587,9 @@ static BOOL DispatchWndMsg(CWnd* pThis, const AFX_MSGMAP_ENTRY* lpEntry, UINT_PT
     case AfxSig_vt:
         (pThis->*AfxWndHandler<void (CWnd::*)(UINT_PTR)>(pfn))((UINT_PTR)wParam);
         break;
-    case AfxSig_vww:
-        (pThis->*AfxWndHandler<void (CWnd::*)(UINT, UINT)>(pfn))((UINT)wParam, (UINT)lParam);
+    case AfxSig_vwwx:
+        // reflected scrolling: the code and the position, without the scroll bar
+        (pThis->*AfxWndHandler<void (CWnd::*)(UINT, UINT)>(pfn))(LOWORD(wParam), HIWORD(wParam));
         break;
     case AfxSig_vbw:
         (pThis->*AfxWndHandler<void (CWnd::*)(BOOL, UINT)>(pfn))((BOOL)wParam, (UINT)lParam);
@@ -640,9 +643,6 @@ static BOOL DispatchWndMsg(CWnd* pThis, const AFX_MSGMAP_ENTRY* lpEntry, UINT_PT
         (pThis->*AfxWndHandler<void (CWnd::*)(int, void*)>(pfn))((int)wParam, (void*)lParam);
         lResult = TRUE;
         break;
-    case AfxSig_bOWNER:
-        lResult = (pThis->*AfxWndHandler<BOOL (CWnd::*)(int, void*)>(pfn))((int)wParam, (void*)lParam);
-        break;
     case AfxSig_wv:
         lResult = (pThis->*AfxWndHandler<UINT (CWnd::*)()>(pfn))();
         break;
@@ -652,10 +652,6 @@ static BOOL DispatchWndMsg(CWnd* pThis, const AFX_MSGMAP_ENTRY* lpEntry, UINT_PT
     case AfxSig_vCALC:
         (pThis->*AfxWndHandler<void (CWnd::*)(BOOL, NCCALCSIZE_PARAMS*)>(pfn))(
             (BOOL)wParam, (NCCALCSIZE_PARAMS*)lParam);
-        break;
-    case AfxSig_vWww:
-        (pThis->*AfxWndHandler<void (CWnd::*)(CWnd*, UINT, UINT)>(pfn))(
-            CWnd::FromHandle((HWND)wParam), LOWORD(lParam), HIWORD(lParam));
         break;
     default:
         return FALSE;
