@@ -1000,8 +1000,9 @@ BOOL CWnd::PreTranslateMessage(MSG*)
     return FALSE;
 }
 
-// Offers the message to each framework object from its window up to hWndStop,
-// stopping at the top-level window.
+// Offers the message to each framework object from its window up to hWndStop.
+// ::GetParent leads from a pop-up to its owner, so a dialog's controls, the dialog
+// and the window that owns it all get their look.
 BOOL PASCAL CWnd::WalkPreTranslateTree(HWND hWndStop, MSG* pMsg)
 {
     for (HWND hWnd = pMsg->hwnd; hWnd != NULL; hWnd = ::GetParent(hWnd))
@@ -1009,7 +1010,7 @@ BOOL PASCAL CWnd::WalkPreTranslateTree(HWND hWndStop, MSG* pMsg)
         CWnd* pWnd = CWnd::FromHandlePermanent(hWnd);
         if (pWnd != NULL && pWnd->PreTranslateMessage(pMsg))
             return TRUE;
-        if (hWnd == hWndStop || !(::GetWindowLongPtr(hWnd, GWL_STYLE) & WS_CHILD))
+        if (hWnd == hWndStop)
             break;
     }
     return FALSE;
