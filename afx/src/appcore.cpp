@@ -211,7 +211,7 @@ BOOL AFXAPI AfxWinInit(HINSTANCE hInstance, HINSTANCE hPrevInstance, LPTSTR lpCm
 
 void AFXAPI AfxWinTerm()
 {
-    AfxDeleteTempObjects(0);
+    AfxDeleteTempObjects();
     _AFX_THREAD_STATE* pThreadState = AfxGetThreadState();
     if (pThreadState->m_hHookOldCbtFilter != NULL)
     {

@@ -70,7 +70,7 @@ CWnd* PASCAL CWnd::FromHandlePermanent(HWND hWnd)
 void PASCAL CWnd::DeleteTempMap()
 {
     if (CHandleMap* pMap = afxMapHWND())
-        pMap->DeleteTemp(0);
+        pMap->DeleteTemp();
 }
 
 BOOL CWnd::Attach(HWND hWndNew)
@@ -1054,9 +1054,11 @@ void CWnd::EndModalState()
 {
 }
 
-// Runs until EndModalLoop. The thread's PreTranslateMessage sees every message,
-// so the controls' own pre-translation works inside the loop. When the queue
-// goes idle, temporary objects made inside this loop are freed.
+// Runs until EndModalLoop, or until the window is gone. The thread's
+// PreTranslateMessage sees every message, so the controls' own pre-translation
+// works inside the loop. As in MFC, temporary objects are not freed here but at
+// the thread's next idle time: a handler of the modal window may keep a pointer
+// from FromHandle for as long as the message it handles.
 int CWnd::RunModalLoop(DWORD dwFlags)
 {
     BOOL bIdle = TRUE;
@@ -1066,16 +1068,7 @@ int CWnd::RunModalLoop(DWORD dwFlags)
     HWND hWndThis = m_hWnd;
     m_nFlags |= (WF_MODALLOOP | WF_CONTINUEMODAL);
 
-    _AFX_THREAD_STATE* pThreadState = AfxGetThreadState();
-    MSG* pMsg = &pThreadState->m_msgCur;
-    unsigned nTempGeneration = afxMapHWND(TRUE)->CurrentGeneration();
-    if (pThreadState->m_nModalTempFloor != 0 && pThreadState->m_pModalTempFloorWnd == this)
-    {
-        nTempGeneration = pThreadState->m_nModalTempFloor - 1;
-        pThreadState->m_nModalTempFloor = 0;
-    }
-    ++pThreadState->m_nModalDepth;
-
+    MSG* pMsg = &AfxGetThreadState()->m_msgCur;
     CWinThread* pThread = AfxGetThread();
     int nResult = -1;
     for (;;)
@@ -1091,8 +1084,6 @@ int CWnd::RunModalLoop(DWORD dwFlags)
             }
             if (!(dwFlags & MLF_NOIDLEMSG) && hWndParent != NULL && lIdleCount == 0)
                 ::SendMessage(hWndParent, WM_ENTERIDLE, MSGF_DIALOGBOX, (LPARAM)hWndThis);
-            if (lIdleCount == 0 && AfxGetModuleThreadState()->m_nTempMapLock == 0)
-                AfxDeleteTempObjects(nTempGeneration);
             if ((dwFlags & MLF_NOKICKIDLE) || !::SendMessage(hWndThis, WM_KICKIDLE, MSGF_DIALOGBOX, lIdleCount++))
                 bIdle = FALSE;
         }
@@ -1124,6 +1115,7 @@ int CWnd::RunModalLoop(DWORD dwFlags)
                 bShowIdle = FALSE;
             }
 
+            // A window destroyed from outside (with its owner, say) ends the loop too.
             if (!::IsWindow(hWndThis) || !ContinueModal())
             {
                 nResult = m_nModalResult;
@@ -1139,7 +1131,6 @@ int CWnd::RunModalLoop(DWORD dwFlags)
     }
 
 ExitModal:
-    --pThreadState->m_nModalDepth;
     m_nFlags &= ~(WF_MODALLOOP | WF_CONTINUEMODAL);
     return nResult;
 }
