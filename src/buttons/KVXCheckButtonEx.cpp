@@ -5,7 +5,7 @@
 // A double click is left to the static control, which reports STN_DBLCLK: ignored, so
 // the second press neither toggles nor notifies.
 BEGIN_MESSAGE_MAP(KVXCheckButtonEx, CStatic)
-    ON_CONTROL_REFLECT(STN_CLICKED, OnClicked)
+    ON_CONTROL_REFLECT(STN_CLICKED, &KVXCheckButtonEx::OnClicked)
     ON_WM_LBUTTONUP()
     ON_WM_MOUSEMOVE()
     ON_WM_KILLFOCUS()

@@ -3,7 +3,7 @@
 #include "resource.h"
 
 BEGIN_MESSAGE_MAP(KVXColorWell, CButton)
-    ON_CONTROL_REFLECT(BN_CLICKED, OnClicked)
+    ON_CONTROL_REFLECT(BN_CLICKED, &KVXColorWell::OnClicked)
 END_MESSAGE_MAP()
 
 KVXColorWell::KVXColorWell()

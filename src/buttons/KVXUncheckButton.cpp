@@ -3,7 +3,7 @@
 #include "BitmapButtonSupport.h"
 
 BEGIN_MESSAGE_MAP(KVXUncheckButton, CStatic)
-    ON_CONTROL_REFLECT(STN_CLICKED, OnClicked)
+    ON_CONTROL_REFLECT(STN_CLICKED, &KVXUncheckButton::OnClicked)
     ON_WM_LBUTTONDBLCLK()
     ON_WM_LBUTTONUP()
     ON_WM_MOUSEMOVE()

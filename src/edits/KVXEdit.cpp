@@ -16,8 +16,8 @@ BEGIN_MESSAGE_MAP(KVXEdit, CEdit)
     ON_WM_CHAR()
     ON_WM_KILLFOCUS()
     ON_WM_SETFOCUS()
-    ON_CONTROL_REFLECT_EX(EN_CHANGE, OnChange)
-    ON_MESSAGE(WM_KVX_SHOWERRORMESSAGE, OnShowErrorMessage)
+    ON_CONTROL_REFLECT_EX(EN_CHANGE, &KVXEdit::OnChange)
+    ON_MESSAGE(WM_KVX_SHOWERRORMESSAGE, &KVXEdit::OnShowErrorMessage)
 END_MESSAGE_MAP()
 
 /////////////////////////////////////////////////////////////////////////////

@@ -9,7 +9,7 @@ BEGIN_MESSAGE_MAP(KVXNumericEdit, KVXEdit)
     ON_WM_KILLFOCUS()
     ON_WM_SETFOCUS()
     ON_WM_DESTROY()
-    ON_CONTROL_REFLECT_EX(EN_CHANGE, OnChange)
+    ON_CONTROL_REFLECT_EX(EN_CHANGE, &KVXNumericEdit::OnChange)
 END_MESSAGE_MAP()
 
 /////////////////////////////////////////////////////////////////////////////
