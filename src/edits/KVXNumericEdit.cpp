@@ -1,6 +1,9 @@
 #include "KVXNumericEdit.h"
 
+#include <afxstat_.h>
+
 #include "KVXSpin.h"
+#include "NumberFormat.h"
 #include "SpinGeometry.h"
 
 BEGIN_MESSAGE_MAP(KVXNumericEdit, KVXEdit)
@@ -142,7 +145,11 @@ int KVXNumericEdit::GetMaximumInclude()
 
 void KVXNumericEdit::PreSubclassWindow()
 {
-    if (::IsWindow(m_hWnd))
+    // During Create the framework still holds this object as the one being created:
+    // Create initialises once the window is complete. Otherwise an existing window (a
+    // dialog control) is being subclassed and is initialised here.
+    const bool bCreating = AfxGetThreadState()->m_pWndInit == this;
+    if (!bCreating && ::IsWindow(m_hWnd))
     {
         CWnd* pParent = CWnd::FromHandle(::GetParent(m_hWnd));
         CRect rect;
@@ -164,26 +171,16 @@ int KVXNumericEdit::SyntaxCheck(int bShow)
 
 void KVXNumericEdit::Initialize(const RECT& rect, CWnd* pParentWnd)
 {
-    // A window made by Create may be initialised twice (once while the framework attaches
-    // it, once by Create itself): keep the one spin object, and rebuild its window only
-    // when the place has changed.
-    const bool bSamePlace = m_pSpin != NULL && m_pParentWnd == pParentWnd && m_rectCreate == rect;
     m_pParentWnd = pParentWnd;
     m_rectCreate = rect;
+    // A repeated call (Create on an object that has its window) keeps the one spin.
     if (m_pSpin == NULL)
         m_pSpin = new KVXSpin;
-    if (!bSamePlace && GetSpinHwnd() != NULL)
-    {
-        m_pSpin->DestroyWindow();
-        m_bSpinButton = TRUE;
-    }
-
-    if (m_bSpinButton && GetSpinHwnd() == NULL)
+    if (m_bSpinButton)
     {
         m_bSpinButton = FALSE;
         SetSpinButtonFlag(TRUE);
     }
-
     SetValueAsVariant(GetValueAsVariant(TRUE), TRUE);
 }
 
