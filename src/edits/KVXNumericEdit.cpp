@@ -207,6 +207,62 @@ int KVXNumericEdit::SpinKeyPointY() const
     return rectSpin.Height() - 3;
 }
 
+BOOL KVXNumericEdit::HandleUndoChar(WCHAR c)
+{
+    if (!(::GetKeyState(VK_CONTROL) & 0x8000) || c != NumberFormat::kUndoChar)
+        return FALSE;
+    if (!m_bUndefined)
+        SetValueAsVariant(m_varCommitted, TRUE);
+    else if (::IsWindow(m_hWnd))
+        SetWindowText(_T(""));
+    return TRUE;
+}
+
+void KVXNumericEdit::MoveIntoRange(bool bWholeNumbers)
+{
+    if (IsInRange(m_varValue))
+        return;
+    KVXVariant varLower = GetMinimumInRange();
+    KVXVariant varUpper = GetMaximumInRange();
+    bool bLowerIsNearer = false;
+    if (bWholeNumbers)
+    {
+        long lCur = 0;
+        long lLower = 0;
+        long lUpper = 0;
+        m_varValue.GetAs(lCur, 1);
+        varLower.GetAs(lLower, 1);
+        varUpper.GetAs(lUpper, 1);
+        bLowerIsNearer = NumberFormat::LowerEndIsNearer(lLower, lUpper, lCur);
+    }
+    else
+    {
+        double dCur = 0.0;
+        double dLower = 0.0;
+        double dUpper = 0.0;
+        m_varValue.GetAs(dCur);
+        varLower.GetAs(dLower);
+        varUpper.GetAs(dUpper);
+        bLowerIsNearer = NumberFormat::LowerEndIsNearer(dLower, dUpper, dCur);
+    }
+    // Each subclass shows an end the way it reads it, as in the comparison above.
+    SetValueAsVariant(bLowerIsNearer ? varLower : varUpper, TRUE);
+}
+
+void KVXNumericEdit::StartFromUndefined(const KVXVariant& varZero)
+{
+    if (!GetUndefined())
+        return;
+    SetValueAsVariant(IsInRange(varZero) ? varZero : GetMinimumInRange(), FALSE);
+}
+
+void KVXNumericEdit::ReleaseSpin()
+{
+    HWND hSpin = GetSpinHwnd();
+    if (m_bSpinButton && hSpin != NULL)
+        ::PostMessage(hSpin, WM_LBUTTONUP, 0, 0);
+}
+
 void KVXNumericEdit::RestoreCommitted()
 {
     m_varValue = m_varCommitted;
