@@ -212,7 +212,7 @@ void KVXColorPopup::PickColor(int nIndex)
 
 void KVXColorPopup::EndPopup(int nResult)
 {
-    if (::GetCapture() == m_hWnd)
+    if (m_hWnd != NULL && ::GetCapture() == m_hWnd)
         ::ReleaseCapture();
     EndDialog(nResult);
 }
@@ -334,7 +334,11 @@ void KVXColorPopup::OnOther()
         dlg.SetWindowName(m_pColorWell->GetColorName());
     dlg.m_cc.rgbResult = m_clrColor;
     dlg.m_cc.Flags |= CC_RGBINIT | CC_FULLOPEN;
-    if (dlg.DoModal() == IDOK)
+    const HWND hWnd = m_hWnd;
+    const INT_PTR nResult = dlg.DoModal();
+    if (!::IsWindow(hWnd))
+        return;     // the popup went, with its well, while the dialog was up
+    if (nResult == IDOK)
     {
         m_clrColor = dlg.GetColor();
         if (m_pColorWell != NULL)

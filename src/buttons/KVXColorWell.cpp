@@ -152,6 +152,18 @@ void KVXColorWell::OnClicked()
     DoColorWellDlg();
 }
 
+// The well's window is gone (with its dialog, say) while its popup may be up: the popup
+// and the colour dialog it owns go too, so that DoColorWellDlg returns at once and
+// sends nothing. Ending the modal loop first also ends it where the popup's window
+// went before the well's (owned by the same top-level window).
+void KVXColorWell::PostNcDestroy()
+{
+    m_popup.EndPopup(IDCANCEL);
+    if (::IsWindow(m_popup.GetSafeHwnd()))
+        m_popup.DestroyWindow();
+    CButton::PostNcDestroy();
+}
+
 void KVXColorWell::DoColorWellDlg()
 {
     if (m_popup.DoModal() != IDOK)
