@@ -1,5 +1,5 @@
 // Fault injection into the colour well's modal loops: while its popup, or the standard
-// colour dialog opened from it, is up, a timer step destroys the well or its top-level
+// colour dialog opened from it, is up, a script step destroys the well or its top-level
 // window. The loops end by themselves (before the script's time limit would cancel
 // them), the capture is free, the parent gets no colour message, and a new well picks
 // a colour as before.
@@ -15,7 +15,6 @@
 
 namespace {
 
-using buttons_test::ColorNotifyRecorder;
 using buttons_test::ModalScript;
 
 struct DeathCase
@@ -36,14 +35,14 @@ class PopupDeathTest : public testing::TestWithParam<DeathCase>
 {
 protected:
     static void SetUpTestSuite() { buttons_test::EnsureLibraryLoaded(); }
+    void SetUp() override { Open(); }
     void TearDown() override { Close(); }
 
     void Open()
     {
         m_parent = std::make_unique<buttons_test::TestParent>(100, 100, 400, 300);
-        ASSERT_TRUE(m_well.Create(_T(""), WS_CHILD | WS_VISIBLE | BS_OWNERDRAW, CRect(20, 20, 100, 44),
-                                  m_parent.get(), 2001));
-        m_recorder = std::make_unique<ColorNotifyRecorder>(m_parent->m_hWnd);
+        ASSERT_TRUE(m_well.Create(_T(""), WS_CHILD | WS_VISIBLE | BS_OWNERDRAW, CRect(20, 20, 100, 44), m_parent.get(), 7));
+        m_recorder = std::make_unique<buttons_test::ColorNotifyRecorder>(m_parent->m_hWnd);
     }
     void Close()
     {
@@ -54,33 +53,28 @@ protected:
 
     std::unique_ptr<buttons_test::TestParent> m_parent;
     KVXColorWell m_well;
-    std::unique_ptr<ColorNotifyRecorder> m_recorder;
+    std::unique_ptr<buttons_test::ColorNotifyRecorder> m_recorder;
 };
 
 TEST_P(PopupDeathTest, LoopsEndWithTheWellAndANewWellWorks)
 {
     const DeathCase& c = GetParam();
-    Open();
     HWND hPopup = NULL;
+    const ModalScript::Step open = [&](HWND hDialog) {
+        hPopup = hDialog;
+        if (c.colorDialog)
+            ::PostMessage(hDialog, WM_COMMAND, IDC_COLOR_OTHER, (LPARAM)::GetDlgItem(hDialog, IDC_COLOR_OTHER));
+        return true;
+    };
+    const ModalScript::Step kill = [&](HWND hDialog) {
+        if (c.colorDialog && hDialog == hPopup)
+            return false;   // until the standard dialog is up
+        c.topLevel ? m_parent->DestroyWindow() : m_well.DestroyWindow();
+        return true;
+    };
     {
-        ModalScript script({ [&](HWND hDialog) {
-                                hPopup = hDialog;
-                                if (c.colorDialog)
-                                    ::PostMessage(hDialog, WM_COMMAND, MAKEWPARAM(IDC_COLOR_OTHER, BN_CLICKED),
-                                                  (LPARAM)::GetDlgItem(hDialog, IDC_COLOR_OTHER));
-                                return true;
-                            },
-                             [&](HWND hDialog) {
-                                 if (c.colorDialog && hDialog == hPopup)
-                                     return false;   // until the standard dialog is up
-                                 if (c.topLevel)
-                                     m_parent->DestroyWindow();
-                                 else
-                                     m_well.DestroyWindow();
-                                 return true;
-                             },
-                             [](HWND) { return false; } },   // a dialog still up: the time limit cancels it
-                           2000);
+        // A dialog still up after the kill waits for the last step: the time limit cancels it.
+        ModalScript script({ open, kill, [](HWND) { return false; } }, 2000);
         m_well.DoColorWellDlg();
         EXPECT_EQ(2u, script.stepsDone());
         EXPECT_FALSE(script.timedOut()) << "a loop ran on after the well was gone";
@@ -94,7 +88,6 @@ TEST_P(PopupDeathTest, LoopsEndWithTheWellAndANewWellWorks)
     // Row 1, column 2 of the default palette: white.
     ModalScript pick({ [](HWND hDialog) { return ::PostMessage(hDialog, WM_LBUTTONUP, 0, MAKELPARAM(50, 30)) != FALSE; } });
     m_well.DoColorWellDlg();
-    EXPECT_TRUE(pick.finished());
     ASSERT_EQ(1, m_recorder->count());
     EXPECT_EQ(RGB(255, 255, 255), m_recorder->records()[0].clrColor);
 }

@@ -1,11 +1,8 @@
-// Fault injection into what the edits hold while the user acts: the error message box
-// and the spin's pressed arrow (capture and auto-repeat timer). From a timer, the edit
-// or its dialog is destroyed, or the application is asked to quit, while the box is up
-// or the arrow held:
-//  - the box's showing state ends on every way out: the same object, given a window
-//    again, shows its next error; a posted quit still reaches the application's loop;
-//  - a held arrow ends with its edit: capture free, no further step into the dead edit,
-//    and a new edit's spin steps as before.
+// Fault injection into what the edits hold while the user acts: the error box and the
+// spin's held arrow. A timer destroys the edit or its dialog, or posts a quit, meanwhile.
+// The box's showing state ends on every way out (the object shows its next error in
+// its next window; the quit reaches the application's loop); a held arrow ends with
+// its edit (capture free, no step into the dead edit, the next window's spin steps).
 #include "edit_harness.h"
 
 #include "CallLater.h"
@@ -16,44 +13,32 @@ namespace {
 using namespace edit_test;
 using orvane_test::CallLater;
 
-enum class Death { Edit, Dialog, Quit };
+enum Death { kEditDies, kDialogDies, kQuitPosted };
 
-struct DeathCase
+std::string DeathName(const testing::TestParamInfo<Death>& info)
 {
-    const char* name;
-    Death death;
-};
-
-std::string CaseName(const testing::TestParamInfo<DeathCase>& info)
-{
-    return info.param.name;
+    const char* const names[] = { "EditDestroyed", "DialogDestroyed", "QuitPosted" };
+    return names[info.param];
 }
 
-class LoopDeath : public testing::TestWithParam<DeathCase>
+class LoopDeath : public testing::TestWithParam<Death>
 {
 protected:
     static void SetUpTestSuite() { EnsureLibraryLoaded(); }
     void TearDown() override { dlg.DestroyWindow(); }
 
-    // The dialog (again, if it died) with the edit subclassed into kId (again, if its
-    // window died).
+    // The dialog and the edit in control nId, each made again if its window died.
     void Open(UINT nId)
     {
-        if (!::IsWindow(dlg))
-        {
-            ASSERT_TRUE(dlg.Open());
-        }
-        if (edit.m_hWnd == NULL)
-        {
-            ASSERT_TRUE(edit.SubclassDlgItem(nId, &dlg));
-        }
+        ASSERT_TRUE(::IsWindow(dlg) || dlg.Open());
+        ASSERT_TRUE(edit.m_hWnd != NULL || edit.SubclassDlgItem(nId, &dlg));
         edit.SetFocus();
     }
-    void Kill(Death death)
+    void Kill()
     {
-        if (death == Death::Edit)
+        if (GetParam() == kEditDies)
             edit.DestroyWindow();
-        else if (death == Death::Dialog)
+        else if (GetParam() == kDialogDies)
             dlg.DestroyWindow();
         else
             ::PostQuitMessage(9);
@@ -68,7 +53,6 @@ using ErrorBoxDeath = LoopDeath;
 
 TEST_P(ErrorBoxDeath, ShowingEndsOnEveryWayOutOfTheBox)
 {
-    const Death death = GetParam().death;
     std::vector<HWND> boxes;
     bool bAnswer = false;
     orvane_test::DialogAnswerer answerer([&](const orvane_test::DialogAnswerer::Seen& seen) {
@@ -80,20 +64,18 @@ TEST_P(ErrorBoxDeath, ShowingEndsOnEveryWayOutOfTheBox)
     Open(kIdEdit1);
     edit.SetWindowText(_T("12x"));
     {
-        CallLater kill(30, [&] { Kill(death); });
-        // Closes a box still up: the edit's own death leaves the box to its owner.
+        CallLater kill(30, [&] { Kill(); });
+        // The edit's own death leaves the box to its owner: closed here.
         CallLater close(1000, [&] { ::PostMessageW(boxes.back(), WM_COMMAND, IDOK, 0); });
         edit.SendMessage(WM_KVX_SHOWERRORMESSAGE);
         EXPECT_TRUE(kill.fired());
-        EXPECT_EQ(death == Death::Edit, close.fired());
+        EXPECT_EQ(GetParam() == kEditDies, close.fired());
     }
     ASSERT_EQ(1u, boxes.size());
-    if (death == Death::Quit)
-    {
-        MSG msg;
-        ASSERT_TRUE(::PeekMessageW(&msg, NULL, WM_QUIT, WM_QUIT, PM_REMOVE)) << "the quit was swallowed";
-        EXPECT_EQ(9u, msg.wParam);
-    }
+    MSG msg = {};
+    const bool bQuit = ::PeekMessageW(&msg, NULL, WM_QUIT, WM_QUIT, PM_REMOVE) != FALSE;
+    EXPECT_EQ(GetParam() == kQuitPosted, bQuit);
+    EXPECT_EQ(bQuit ? 9u : 0u, msg.wParam);
 
     Open(kIdEdit2);
     edit.SetWindowText(_T("34x"));
@@ -102,8 +84,7 @@ TEST_P(ErrorBoxDeath, ShowingEndsOnEveryWayOutOfTheBox)
     EXPECT_EQ(2u, boxes.size()) << "the next error shows no box";
 }
 
-INSTANTIATE_TEST_SUITE_P(Edits, ErrorBoxDeath, testing::Values(DeathCase{ "EditDestroyed", Death::Edit },
-    DeathCase{ "DialogDestroyed", Death::Dialog }, DeathCase{ "QuitPosted", Death::Quit }), CaseName);
+INSTANTIATE_TEST_SUITE_P(Edits, ErrorBoxDeath, testing::Values(kEditDies, kDialogDies, kQuitPosted), DeathName);
 
 using SpinDeath = LoopDeath;
 
@@ -113,7 +94,7 @@ TEST_P(SpinDeath, HeldArrowEndsWithItsEdit)
     const HWND hSpin = edit.SpinHwnd();
     ::SendMessageW(hSpin, WM_LBUTTONDOWN, MK_LBUTTON, MAKELPARAM(1, 1));
     ASSERT_EQ(hSpin, ::GetCapture());
-    CallLater kill(30, [&] { Kill(GetParam().death); });
+    CallLater kill(30, [&] { Kill(); });
     EXPECT_TRUE(orvane_test::WaitFor([&] { return kill.fired(); }, 2000));
     orvane_test::PumpUntilIdle(50);
     EXPECT_EQ(nullptr, ::GetCapture());
@@ -128,7 +109,6 @@ TEST_P(SpinDeath, HeldArrowEndsWithItsEdit)
     EXPECT_EQ(nullptr, ::GetCapture());
 }
 
-INSTANTIATE_TEST_SUITE_P(Edits, SpinDeath, testing::Values(DeathCase{ "EditDestroyed", Death::Edit },
-    DeathCase{ "DialogDestroyed", Death::Dialog }), CaseName);
+INSTANTIATE_TEST_SUITE_P(Edits, SpinDeath, testing::Values(kEditDies, kDialogDies), DeathName);
 
 } // namespace

@@ -9,15 +9,10 @@ namespace {
 
 using namespace edit_test;
 
-class CountingLongEdit : public KVXLongEdit
+struct CountingLongEdit : KVXLongEdit
 {
-public:
     int nShown = 0;
-    int SetValueAsVariant(KVXVariant varValue, int bCommit) override
-    {
-        ++nShown;
-        return KVXLongEdit::SetValueAsVariant(varValue, bCommit);
-    }
+    int SetValueAsVariant(KVXVariant v, int bCommit) override { ++nShown; return KVXLongEdit::SetValueAsVariant(v, bCommit); }
 };
 
 TEST(NumericEditCreate, InitialisesOnceWhetherCreatedOrSubclassed)
@@ -32,11 +27,6 @@ TEST(NumericEditCreate, InitialisesOnceWhetherCreatedOrSubclassed)
     EXPECT_EQ(1, created.nShown);
     EXPECT_EQ(1, subclassed.nShown);
     EXPECT_EQ("0", Narrow(WindowText(created)));
-    int nSpins = 0;   // the spins are the framework's default class
-    wchar_t szClass[16];
-    for (HWND h = ::GetWindow(dlg, GW_CHILD); h != NULL; h = ::GetWindow(h, GW_HWNDNEXT))
-        nSpins += ::GetClassNameW(h, szClass, 16) > 0 && wcscmp(szClass, L"AfxWnd") == 0;
-    EXPECT_EQ(2, nSpins);
     dlg.DestroyWindow();
 }
 

@@ -26,9 +26,7 @@ const DeathCase kDeaths[] = {
     { "BandTopLevelDestroyed", true, true },
 };
 
-class LoopDeathTest : public TreeFixture, public testing::WithParamInterface<DeathCase>
-{
-};
+class LoopDeathTest : public TreeFixture, public testing::WithParamInterface<DeathCase> {};
 
 TEST_P(LoopDeathTest, LoopEndsAtOnceAndANewTreeWorks)
 {
@@ -37,10 +35,7 @@ TEST_P(LoopDeathTest, LoopEndsAtOnceAndANewTreeWorks)
     const CPoint press = c.band ? RightOfLabel("B") : LabelPoint("B");
     PointCursorAt(press);
     CallLater kill(30, [&] {
-        if (c.topLevel)
-            m_parent.DestroyWindow();
-        else
-            m_tree.DestroyWindow();
+        c.topLevel ? m_parent.DestroyWindow() : m_tree.DestroyWindow();
         m_parent.ClearTrace();
         m_tree.m_hookTrace.clear();
     });
@@ -53,10 +48,7 @@ TEST_P(LoopDeathTest, LoopEndsAtOnceAndANewTreeWorks)
     EXPECT_EQ("", m_parent.Trace());
     EXPECT_EQ("", m_tree.m_hookTrace);
 
-    if (c.topLevel)
-    {
-        ASSERT_TRUE(m_parent.CreateParent(60, 60, 320, 420));
-    }
+    ASSERT_TRUE(!c.topLevel || m_parent.CreateParent(60, 60, 320, 420));
     CreateTree();
     Build(kSmallTree);
     if (c.band)
