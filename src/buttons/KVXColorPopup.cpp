@@ -10,6 +10,7 @@ BEGIN_MESSAGE_MAP(KVXColorPopup, CDialog)
     ON_WM_LBUTTONDOWN()
     ON_WM_LBUTTONUP()
     ON_BN_CLICKED(IDC_COLOR_OTHER, &KVXColorPopup::OnOther)
+    ON_WM_CANCELMODE()
 END_MESSAGE_MAP()
 
 KVXColorPopup::KVXColorPopup()
@@ -260,6 +261,19 @@ void KVXColorPopup::OnMouseMove(UINT nFlags, CPoint point)
             MoveFocusTo(rcOther.PtInRect(point) ? pOther : pDummy);
         }
     }
+}
+
+// The popup sees clicks outside only through its capture. A cancel mode that takes it
+// while the popup is still the active window is answered by taking it back: this
+// platform sends one late, when the focus comes back from the colour dialog, and the
+// popup would then stay open, deaf to clicks outside. (Opening the colour dialog
+// releases the capture first, so its cancel mode finds none to take back.)
+void KVXColorPopup::OnCancelMode()
+{
+    const bool bHeld = ::GetCapture() == m_hWnd;
+    CDialog::OnCancelMode();
+    if (bHeld && ::GetCapture() == NULL && ::GetActiveWindow() == m_hWnd && IsWindowEnabled())
+        SetCapture();
 }
 
 void KVXColorPopup::OnLButtonDown(UINT nFlags, CPoint point)
