@@ -138,7 +138,7 @@ BEGIN_MESSAGE_MAP(CGalleryWnd, CWnd)
     ON_WM_CREATE()
     ON_WM_DESTROY()
     ON_WM_SIZE()
-    ON_NOTIFY(TCN_SELCHANGE, 1, OnTabChange)
+    ON_NOTIFY(TCN_SELCHANGE, 1, &CGalleryWnd::OnTabChange)
 END_MESSAGE_MAP()
 
 BOOL CGalleryWnd::CreateGallery()

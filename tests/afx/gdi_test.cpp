@@ -2,7 +2,8 @@
 // - SelectObject returns the previously selected object (the owning C++ object, or
 //   a typed temporary wrapper) and restoring returns the one selected before
 // - every object type deletes its handle in the destructor; Attach over a held
-//   handle deletes the old one; temporary wrappers never delete their handle
+//   handle leaves the old one to the caller, as MFC does, but no longer names the
+//   object for it; temporary wrappers never delete their handle
 // - FromHandle: owner first, otherwise one typed temporary per handle until DeleteTempMap
 // - pixels: FillSolidRect, Draw3dRect edges, FillRect with a CBrush in a memory DC
 // - CFont::CreatePointFont height from the DC's resolution; GetTextExtent
@@ -139,14 +140,16 @@ TEST_F(GdiTest, DestructorsDeleteEveryObject)
     EXPECT_EQ(0u, ::GetObjectType(hdc));
 }
 
-TEST_F(GdiTest, AttachOverHeldHandleDeletesIt)
+TEST_F(GdiTest, AttachOverHeldHandleLetsGoOfIt)
 {
     CBrush brush;
     ASSERT_TRUE(brush.CreateSolidBrush(RGB(10, 10, 10)));
     HGDIOBJ hFirst = brush.m_hObject;
     ASSERT_TRUE(brush.CreateSolidBrush(RGB(20, 20, 20)));
     HGDIOBJ hSecond = brush.m_hObject;
-    EXPECT_EQ(0u, ::GetObjectType(hFirst));
+    EXPECT_EQ((DWORD)OBJ_BRUSH, ::GetObjectType(hFirst));
+    EXPECT_NE(&brush, CGdiObject::FromHandle(hFirst));
+    ::DeleteObject(hFirst);
     EXPECT_EQ((DWORD)OBJ_BRUSH, ::GetObjectType(hSecond));
     EXPECT_EQ(&brush, CGdiObject::FromHandle(hSecond));
 
