@@ -1,7 +1,7 @@
 #include "TreeHarness.h"
 
 #include "Input.h"
-#include "OrvaneControls.h"
+#include "OrvaneLibrary.h"
 
 #include <sstream>
 
@@ -118,7 +118,6 @@ BOOL CRecordingParent::OnNotify(WPARAM wParam, LPARAM lParam, LRESULT* pResult)
             r.newMask = pNM->itemNew.mask;
             r.newParam = pNM->itemNew.lParam;
             r.ptDrag = pNM->ptDrag;
-            r.action = pNM->action;
         }
         m_records.push_back(r);
         if (pHdr->code == NM_CLICK || pHdr->code == NM_RCLICK)
@@ -189,12 +188,7 @@ const CRecordingParent::Record* CRecordingParent::Last(UINT code) const
 
 void TreeFixture::SetUpTestSuite()
 {
-    static bool loaded = false;
-    if (!loaded)
-    {
-        LoadOrvaneControlsLibrary();
-        loaded = true;
-    }
+    orvane_test::LoadLibraryOnce();
 }
 
 void TreeFixture::SetUp()
@@ -258,6 +252,15 @@ void TreeFixture::BuildFlat(int count)
     for (int i = 0; i < count; ++i)
         spec += "I" + std::to_string(i) + "\n";
     Build(spec.c_str());
+}
+
+std::vector<std::string> TreeFixture::Names(const std::string& list) const
+{
+    std::istringstream words(list);
+    std::vector<std::string> names;
+    for (std::string name; words >> name;)
+        names.push_back(name);
+    return names;
 }
 
 HTREEITEM TreeFixture::Item(const std::string& name) const

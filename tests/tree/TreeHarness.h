@@ -37,9 +37,7 @@ inline const char* const kSmallTree =
 class CTestTree : public CMultiTree
 {
 public:
-    using CMultiTree::DoBanding;
     using CMultiTree::OnButtonDown;
-    using CMultiTree::SelectAllIgnore;
     using CMultiTree::UpdateSelectionForRect;
 
     HTREEITEM Anchor() const { return m_hAnchorItem; }
@@ -62,7 +60,6 @@ public:
         UINT newMask;
         LPARAM newParam;
         POINT ptDrag;
-        UINT action;
     };
 
     BOOL CreateParent(int x, int y, int cx, int cy);
@@ -124,13 +121,17 @@ protected:
     void Build(const char* spec);
     // count flat items "I0".."I<count-1>".
     void BuildFlat(int count);
+    // Names of the items in a blank-separated list.
+    std::vector<std::string> Names(const std::string& list) const;
 
     HTREEITEM Item(const std::string& name) const;
     std::string Selected() const { return SelectedNames(m_tree); }
     std::string Caret() const { return ItemName(m_tree, m_tree.GetSelectedItem()); }
 
-    // Puts the item's state directly (no notification) to arrange a starting state.
+    // Puts the items' state directly (no notification) to arrange a starting state:
+    // the caret ("" for none) and the selected items, and no anchor.
     void Arrange(const std::vector<std::string>& selected, const std::string& caret);
+    void Arrange(const char* selected, const char* caret) { Arrange(Names(selected), caret); }
 
     // Mouse, in client coordinates of the tree.
     CPoint LabelPoint(const std::string& name) const;
