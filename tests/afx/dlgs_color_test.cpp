@@ -13,60 +13,14 @@
 
 #include <commctrl.h>
 
+#include "Input.h"
+
 #include <functional>
 #include <vector>
 
 namespace {
 
-// Runs one step per timer tick against the active dialog of this thread, while any
-// modal loop runs; steps return false to be retried. Cancels everything after 5 s.
-class DialogSteps
-{
-public:
-    using Step = std::function<bool(HWND)>;
-    explicit DialogSteps(std::vector<Step> steps) : m_steps(std::move(steps)), m_start(::GetTickCount())
-    {
-        s_current = this;
-        m_timer = ::SetTimer(NULL, 0, 15, Tick);
-    }
-    ~DialogSteps()
-    {
-        ::KillTimer(NULL, m_timer);
-        s_current = nullptr;
-    }
-    bool finished() const { return m_next == m_steps.size(); }
-
-private:
-    static void CALLBACK Tick(HWND, UINT, UINT_PTR, DWORD)
-    {
-        DialogSteps* self = s_current;
-        if (self == nullptr || self->m_busy || self->finished())
-            return;
-        self->m_busy = true;
-        HWND hActive = ::GetActiveWindow();
-        wchar_t cls[16] = {};
-        ::GetClassNameW(hActive, cls, 16);
-        if (::GetTickCount() - self->m_start > 5000)
-        {
-            ::PostMessage(hActive, WM_COMMAND, IDCANCEL, 0);
-            self->m_next = self->m_steps.size() + 1;
-        }
-        else if (lstrcmpW(cls, L"#32770") == 0 && ::IsWindowVisible(hActive) && self->m_steps[self->m_next](hActive))
-        {
-            ++self->m_next;
-        }
-        self->m_busy = false;
-    }
-
-    static DialogSteps* s_current;
-    std::vector<Step> m_steps;
-    size_t m_next = 0;
-    DWORD m_start;
-    UINT_PTR m_timer = 0;
-    bool m_busy = false;
-};
-
-DialogSteps* DialogSteps::s_current = nullptr;
+using DialogSteps = orvane_test::ModalScript;
 
 bool TypeColourAndOk(HWND hDlg, int r, int g, int b)
 {
