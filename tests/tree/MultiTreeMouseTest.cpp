@@ -8,7 +8,8 @@
 // - the anchor across presses and deletion; TVS_DISABLEDRAGDROP; labels-only banding;
 // - expand button and state icon handed to the tree; the right button;
 // - a press ended by Escape, by a lost capture or by WM_QUIT;
-// - band geometry against the tree's own rows; auto-scroll by move and by timer ticks.
+// - band geometry against the tree's own rows; auto-scroll by move and by timer ticks;
+// - the highlight of every selected label, not only the caret's, follows the focus.
 #include "TreeHarness.h"
 
 #include "Input.h"
@@ -28,13 +29,17 @@ protected:
         Build(kSmallTree);
     }
 
-    // Press at pt with the messages queued before; the probe runs first in the loop.
+    // Press at pt with the messages queued before; the probe runs first in the loop. A move
+    // at x = -1 stands for an Escape key press.
     void Press(CPoint pt, UINT keys, const std::vector<CPoint>& moves)
     {
         PointCursorAt(pt);
         m_parent.PostProbe();
         for (const CPoint& move : moves)
-            PostMove(move, keys | MK_LBUTTON);
+            if (move.x == -1)
+                m_tree.PostMessage(WM_KEYDOWN, VK_ESCAPE, 0x00010001);
+            else
+                PostMove(move, keys | MK_LBUTTON);
         PostButtonUp(moves.empty() ? pt : moves.back(), keys);
         SendButtonDown(pt, keys | MK_LBUTTON);
         orvane_test::PumpUntilIdle(50);
@@ -59,7 +64,7 @@ protected:
         return where == "_" ? EmptySpaceBelowItems() : where[0] == '>' ? RightOfLabel(where.substr(1)) : LabelPoint(where);
     }
     // Item names: that item's row at the press's x; "dx,dy": offsets from the press, where
-    // 'd' stands for the system's drag distance ("d+1,0" is one pixel beyond it).
+    // 'd' stands for the system's drag distance ("d+1,0" is one pixel beyond it); "esc".
     std::vector<CPoint> Moves(const std::string& spec, CPoint press) const
     {
         std::vector<CPoint> moves;
@@ -69,7 +74,7 @@ protected:
             const size_t comma = w.find(',');
             if (comma == std::string::npos)
             {
-                moves.emplace_back(press.x, LabelPoint(w).y);
+                moves.emplace_back(w == "esc" ? -1 : press.x, w == "esc" ? 0 : LabelPoint(w).y);
                 continue;
             }
             auto offset = [](std::string part, int drag) {
@@ -90,6 +95,7 @@ protected:
 struct PressCase
 {
     const char* name;
+    DWORD style;          // extra tree styles
     const char* before;   // selected items
     const char* caret;
     const char* at;
@@ -98,29 +104,31 @@ struct PressCase
     const char* probe;    // the selection between press and release; nullptr: not checked
     const char* selected;
     const char* caretAfter;   // nullptr: not checked
-    const char* last;     // the last notification ([*]click, drag:+item)
+    const char* last;     // the last notification ([*]click, drag:+item); "-": neither click nor drag
 };
 
 const PressCase kPressCases[] = {
-    { "ClickOnAnUnselectedItemSelectsOnlyItAtOnce", "A B", "A", "D", 0, "", "D", "D", "D", "*click" },
-    { "ClickInsideAMultipleSelectionKeepsItUntilRelease", "A B D", "A", "B", 0, "", "A B D", "B", "B", "*click" },
-    { "DragBeyondTheDistanceKeepsTheSelection", "A B D", "A", "B", 0, "d,0 d+1,0", nullptr, "A B D", "B", "*drag:+B" },
-    { "VerticalDragBeyondTheDistance", "", "A", "C", 0, "0,-d-1", nullptr, "C", "C", "*drag:+C" },
-    { "MovesWithinTheDistanceStayAClick", "A B D", "A", "B", 0, "d,-d -d,d", nullptr, "B", "B", "*click" },
-    { "CtrlClickAddsAtTheRelease", "A B", "A", "D", MK_CONTROL, "", "A B", "A B D", "D", "*click" },
-    { "CtrlClickRemovesAtTheRelease", "A B D", "D", "B", MK_CONTROL, "", "A B D", "A D", "B", "*click" },
-    { "ShiftClickSelectsTheRangeFromTheCaretAtThePress", "A1", "A1", "C", MK_SHIFT, "", "A1 A2 A2a B C",
+    { "ClickOnAnUnselectedItemSelectsOnlyItAtOnce", 0, "A B", "A", "D", 0, "", "D", "D", "D", "*click" },
+    { "ClickInsideAMultipleSelectionKeepsItUntilRelease", 0, "A B D", "A", "B", 0, "", "A B D", "B", "B", "*click" },
+    { "DragBeyondTheDistanceKeepsTheSelection", 0, "A B D", "A", "B", 0, "d,0 d+1,0", nullptr, "A B D", "B", "*drag:+B" },
+    { "VerticalDragBeyondTheDistance", 0, "", "A", "C", 0, "0,-d-1", nullptr, "C", "C", "*drag:+C" },
+    { "MovesWithinTheDistanceStayAClick", 0, "A B D", "A", "B", 0, "d,-d -d,d", nullptr, "B", "B", "*click" },
+    { "CtrlClickAddsAtTheRelease", 0, "A B", "A", "D", MK_CONTROL, "", "A B", "A B D", "D", "*click" },
+    { "CtrlClickRemovesAtTheRelease", 0, "A B D", "D", "B", MK_CONTROL, "", "A B D", "A D", "B", "*click" },
+    { "ShiftClickSelectsTheRangeFromTheCaretAtThePress", 0, "A1", "A1", "C", MK_SHIFT, "", "A1 A2 A2a B C",
       "A1 A2 A2a B C", "C", "*click" },
-    { "CtrlShiftClickAddsTheRange", "B E", "B", "D", MK_SHIFT | MK_CONTROL, "", nullptr, "B C C1 D E", "D", "*click" },
-    { "ShiftClickWithoutACaretSelectsTheItemAlone", "", "", "C", MK_SHIFT, "", nullptr, "C", "C", "*click" },
-    { "PressOnEmptySpaceClearsTheSelection", "B D", "B", "_", 0, "", nullptr, "", nullptr, "*click" },
-    { "ShiftPressOnEmptySpaceKeepsIt", "B D", "B", "_", MK_SHIFT, "", nullptr, "B D", nullptr, "*click" },
-    { "PlainBandSelectsTheTouchedRowsOnly", "E", "A", ">B", 0, "C D", nullptr, "B C C1 D", "A", "*click" },
-    { "BandWithinTheDragDistanceDoesNotStart", "E", "A", ">B", MK_CONTROL, "2,2", nullptr, "E", nullptr, "*click" },
-    { "CtrlBandTogglesSnapshotItems", "B C", "A", ">A", MK_CONTROL, "C", nullptr, "A A1 A2 A2a", nullptr, "*click" },
-    { "CtrlBandRestoresSnapshotItemsWhenItLeavesThem", "B C", "A", ">A", MK_CONTROL, "C A1", nullptr, "A A1 B C",
+    { "CtrlShiftClickAddsTheRange", 0, "B E", "B", "D", MK_SHIFT | MK_CONTROL, "", nullptr, "B C C1 D E", "D", "*click" },
+    { "ShiftClickWithoutACaretSelectsTheItemAlone", 0, "", "", "C", MK_SHIFT, "", nullptr, "C", "C", "*click" },
+    { "PressOnEmptySpaceClearsTheSelection", 0, "B D", "B", "_", 0, "", nullptr, "", nullptr, "*click" },
+    { "ShiftPressOnEmptySpaceKeepsIt", 0, "B D", "B", "_", MK_SHIFT, "", nullptr, "B D", nullptr, "*click" },
+    { "PlainBandSelectsTheTouchedRowsOnly", 0, "E", "A", ">B", 0, "C D", nullptr, "B C C1 D", "A", "*click" },
+    { "BandWithinTheDragDistanceDoesNotStart", 0, "E", "A", ">B", MK_CONTROL, "2,2", nullptr, "E", nullptr, "*click" },
+    { "CtrlBandTogglesSnapshotItems", 0, "B C", "A", ">A", MK_CONTROL, "C", nullptr, "A A1 A2 A2a", nullptr, "*click" },
+    { "CtrlBandRestoresSnapshotItemsWhenItLeavesThem", 0, "B C", "A", ">A", MK_CONTROL, "C A1", nullptr, "A A1 B C",
       nullptr, "*click" },
-    { "ShiftBandTakesOverTheItemsItTouched", "C E", "A", ">A", MK_SHIFT, "C A1", nullptr, "A A1 E", nullptr, "*click" },
+    { "ShiftBandTakesOverTheItemsItTouched", 0, "C E", "A", ">A", MK_SHIFT, "C A1", nullptr, "A A1 E", nullptr, "*click" },
+    { "DisabledDragDropSendsNoBeginDrag", TVS_DISABLEDRAGDROP, "A B", "A", "B", 0, "20,0", nullptr, "A B", "B", "-" },
+    { "EscapeClearsEverythingAndEndsTheBand", 0, "D E", "A", ">A", MK_CONTROL, "B esc E", nullptr, "", nullptr, "*click" },
 };
 
 TEST_F(MouseTest, Presses)
@@ -128,6 +136,11 @@ TEST_F(MouseTest, Presses)
     for (const PressCase& c : kPressCases)
     {
         SCOPED_TRACE(c.name);
+        if (c.style != 0)
+        {
+            CreateTree(c.style);
+            Build(kSmallTree);
+        }
         Arrange(c.before, c.caret);
         const CPoint press = At(c.at);
         Press(press, c.keys, Moves(c.moves, press));
@@ -136,8 +149,17 @@ TEST_F(MouseTest, Presses)
         EXPECT_EQ(c.selected, Selected());
         if (c.caretAfter != nullptr)
             EXPECT_EQ(c.caretAfter, Caret());
-        EXPECT_EQ(c.last, LastCode()) << m_parent.Trace();
-        EXPECT_EQ(m_tree.m_hWnd, ::GetFocus());
+        if (std::string(c.last) == "-")
+        {
+            EXPECT_EQ(nullptr, m_parent.Last(NM_CLICK)) << m_parent.Trace();
+            EXPECT_EQ(nullptr, m_parent.Last(TVN_BEGINDRAGW)) << m_parent.Trace();
+        }
+        else
+        {
+            EXPECT_EQ(c.last, LastCode()) << m_parent.Trace();
+            EXPECT_EQ(m_tree.m_hWnd, ::GetFocus());
+        }
+        EXPECT_EQ(nullptr, ::GetCapture());
         if (const CRecordingParent::Record* drag = m_parent.Last(TVN_BEGINDRAGW))
         {
             EXPECT_TRUE(drag->emulated);
@@ -148,6 +170,11 @@ TEST_F(MouseTest, Presses)
         }
         else if (!m_parent.m_selectionAtClick.empty())
             EXPECT_EQ(c.selected, m_parent.m_selectionAtClick.back()) << "NM_CLICK comes after the selection";
+        if (c.style != 0)
+        {
+            CreateTree();
+            Build(kSmallTree);
+        }
     }
 }
 
@@ -171,19 +198,6 @@ TEST_F(MouseTest, TheAnchorLastsAcrossShiftClicksUntilAPlainClickOrItsDeletion)
     EXPECT_EQ(NULL, m_tree.Anchor());
     Press(LabelPoint("B"), MK_SHIFT, {});
     EXPECT_EQ("B C C1 D", Selected());   // from the caret, not from a stale handle
-}
-
-TEST_F(MouseTest, DisabledDragDropSendsNoBeginDrag)
-{
-    CreateTree(TVS_DISABLEDRAGDROP);
-    Build(kSmallTree);
-    Arrange("A B", "A");
-    const CPoint press = LabelPoint("B");
-    Press(press, 0, { CPoint(press.x + 20, press.y) });
-    EXPECT_EQ(nullptr, m_parent.Last(TVN_BEGINDRAGW)) << m_parent.Trace();
-    EXPECT_EQ(nullptr, m_parent.Last(NM_CLICK)) << m_parent.Trace();
-    EXPECT_EQ("A B", Selected());
-    EXPECT_EQ("B", Caret());
 }
 
 TEST_F(MouseTest, BandingHitTestsLabelsInsteadOfRows)
@@ -254,23 +268,6 @@ TEST_F(MouseTest, RightButtonSelectsWithoutTouchingTheAnchorAndSendsRClickOrRDra
     orvane_test::PumpUntilIdle(50);
     EXPECT_EQ("*rdrag:+B", LastCode());
     EXPECT_EQ("A B", Selected());
-}
-
-TEST_F(MouseTest, EscapeClearsEverythingAndEndsTheBand)
-{
-    Arrange("D E", "A");
-    const CPoint start = RightOfLabel("A");
-    PointCursorAt(start);
-    PostMove(CPoint(start.x, LabelPoint("B").y));
-    m_tree.PostMessage(WM_KEYDOWN, VK_ESCAPE, 0x00010001);
-    PostMove(CPoint(start.x, LabelPoint("E").y));   // after the band: not a band move
-    PostButtonUp(CPoint(start.x, LabelPoint("E").y));
-    SendButtonDown(start, MK_LBUTTON | MK_CONTROL);
-    EXPECT_EQ("", Selected());
-    EXPECT_EQ("*click", LastCode());
-    EXPECT_EQ(nullptr, ::GetCapture());
-    orvane_test::PumpUntilIdle(50);
-    EXPECT_EQ("", Selected());
 }
 
 TEST_F(MouseTest, CaptureLostEndsAPressWithoutClickAndABandAsAfterARelease)
@@ -457,6 +454,36 @@ TEST_F(ScrollingBandTest, HeldBelowTheClientAreaScrollsOneLinePerTick)
     EXPECT_GE(lines, 3) << "elapsed " << elapsed;
     EXPECT_LE(lines, 1 + static_cast<int>(elapsed / 75)) << "elapsed " << elapsed;
     EXPECT_EQ(Range(lastRow, RowAt(below.y)), Selected());
+}
+
+TEST_F(MouseTest, SelectedLabelsFollowTheFocus)
+{
+    Arrange("A C", "C");
+    m_tree.SetFocus();
+    m_tree.RedrawWindow();
+    // Pixels of the highlight colour inside an item's label, as on screen now.
+    auto highlighted = [this](const char* name) {
+        m_tree.UpdateWindow();
+        CRect rc;
+        m_tree.GetItemRect(Item(name), &rc, TRUE);
+        HDC dc = ::GetDC(m_tree.m_hWnd);
+        int count = 0;
+        for (int y = rc.top; y < rc.bottom; ++y)
+            for (int x = rc.left; x < rc.right; ++x)
+                count += ::GetPixel(dc, x, y) == ::GetSysColor(COLOR_HIGHLIGHT) ? 1 : 0;
+        ::ReleaseDC(m_tree.m_hWnd, dc);
+        return count;
+    };
+    EXPECT_GT(highlighted("A"), 0);
+    EXPECT_GT(highlighted("C"), 0);
+    EXPECT_EQ(0, highlighted("B"));
+    m_parent.SetFocus();
+    orvane_test::PumpUntilIdle(50);
+    EXPECT_EQ(0, highlighted("A"));
+    EXPECT_EQ(0, highlighted("C"));
+    m_tree.SetFocus();
+    orvane_test::PumpUntilIdle(50);
+    EXPECT_GT(highlighted("A"), 0);
 }
 
 } // namespace

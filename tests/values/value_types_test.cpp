@@ -187,10 +187,6 @@ struct ToLongCase
     long expected;
 };
 
-void PrintTo(const ToLongCase& c, std::ostream* os) { *os << c.name; }
-
-std::string ToLongName(const testing::TestParamInfo<ToLongCase>& info) { return info.param.name; }
-
 VARIANT MakeVariant(VARTYPE vt, LONGLONG bits)
 {
     VARIANT var;
@@ -232,67 +228,62 @@ const ToLongCase kToLongCases[] = {
     { "Unsigned64Huge", KVXVariant(MakeVariant(VT_UI8, -1)), KVT_VARIANT_OVERFLOW, 0 },
 };
 
-class VariantToLong : public testing::TestWithParam<ToLongCase> {};
-
-TEST_P(VariantToLong, Converts)
+TEST(KVXVariantConversion, ToLong)
 {
-    const ToLongCase& c = GetParam();
-    long value = 12345;
-    EXPECT_EQ(c.result, c.value.GetAs(value, 1));
-    EXPECT_EQ(c.result == KVT_VARIANT_OK ? c.expected : 12345, value);
+    for (const ToLongCase& c : kToLongCases)
+    {
+        long value = 12345;
+        EXPECT_EQ(c.result, c.value.GetAs(value, 1)) << c.name;
+        EXPECT_EQ(c.result == KVT_VARIANT_OK ? c.expected : 12345, value) << c.name;
+    }
 }
 
-INSTANTIATE_TEST_SUITE_P(Table, VariantToLong, testing::ValuesIn(kToLongCases), ToLongName);
-
-TEST(KVXVariantConversion, ToDouble)
+VARIANT MakeSingle(float value)
 {
-    double value = 0.0;
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(-3L).GetAs(value));
-    EXPECT_EQ(-3.0, value);
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(0.1).GetAs(value));
-    EXPECT_EQ(0.1, value);
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(KVXString(L"1.5e3")).GetAs(value));
-    EXPECT_EQ(1500.0, value);
-    value = 7.0;
-    EXPECT_EQ(KVT_VARIANT_OVERFLOW, KVXVariant(KVXString(L"1e309")).GetAs(value));
-    EXPECT_EQ(KVT_VARIANT_OVERFLOW, KVXVariant(KVXString(L"1e-400")).GetAs(value));
-    EXPECT_EQ(KVT_VARIANT_NOT_A_NUMBER, KVXVariant(KVXString(L"1,5")).GetAs(value));
-    EXPECT_EQ(KVT_VARIANT_TYPE_MISMATCH, KVXVariant(MakeVariant(VT_NULL, 0)).GetAs(value));
-    EXPECT_EQ(7.0, value);
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(MakeVariant(VT_I2, 300)).GetAs(value));
-    EXPECT_EQ(300.0, value);
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(MakeVariant(VT_UI4, 0xFFFFFFFF)).GetAs(value));
-    EXPECT_EQ(4294967295.0, value);
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(MakeVariant(VT_UI8, -1)).GetAs(value));
-    EXPECT_EQ(18446744073709551616.0, value);
+    VARIANT var;
+    VariantInit(&var);
+    var.vt = VT_R4;
+    var.fltVal = value;
+    return var;
 }
 
-TEST(KVXVariantConversion, ToText)
+TEST(KVXVariantConversion, ToDoubleAndToText)
 {
-    KVXString text;
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(-42L).GetAs(text));
-    EXPECT_EQ(L"-42", Text(text));
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(0.1).GetAs(text));
-    EXPECT_EQ(L"0.1", Text(text));
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(1e300).GetAs(text));
-    EXPECT_EQ(L"1e+300", Text(text));
-    VARIANT single;
-    VariantInit(&single);
-    single.vt = VT_R4;
-    single.fltVal = 0.1f;
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(single).GetAs(text));
-    EXPECT_EQ(L"0.1", Text(text));
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(MakeVariant(VT_I2, -7)).GetAs(text));
-    EXPECT_EQ(L"-7", Text(text));
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(MakeVariant(VT_UI4, 0xFFFFFFFF)).GetAs(text));
-    EXPECT_EQ(L"4294967295", Text(text));
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(MakeVariant(VT_I8, INT64_MIN)).GetAs(text));
-    EXPECT_EQ(L"-9223372036854775808", Text(text));
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(MakeVariant(VT_UI8, -1)).GetAs(text));
-    EXPECT_EQ(L"18446744073709551615", Text(text));
-    text = L"kept";
-    EXPECT_EQ(KVT_VARIANT_TYPE_MISMATCH, KVXVariant(MakeVariant(VT_NULL, 0)).GetAs(text));
-    EXPECT_EQ(L"kept", Text(text));
+    const struct { const char* name; KVXVariant value; KVTEnumVariantError result; double expected; } doubles[] = {
+        { "Long", KVXVariant(-3L), KVT_VARIANT_OK, -3.0 },
+        { "TextExponent", KVXVariant(KVXString(L"1.5e3")), KVT_VARIANT_OK, 1500.0 },
+        { "TextOverflow", KVXVariant(KVXString(L"1e309")), KVT_VARIANT_OVERFLOW, 0 },
+        { "TextTooSmall", KVXVariant(KVXString(L"1e-400")), KVT_VARIANT_OVERFLOW, 0 },
+        { "TextComma", KVXVariant(KVXString(L"1,5")), KVT_VARIANT_NOT_A_NUMBER, 0 },
+        { "Null", KVXVariant(MakeVariant(VT_NULL, 0)), KVT_VARIANT_TYPE_MISMATCH, 0 },
+        { "UnsignedAllBits", KVXVariant(MakeVariant(VT_UI4, 0xFFFFFFFF)), KVT_VARIANT_OK, 4294967295.0 },
+        { "Unsigned64AllBits", KVXVariant(MakeVariant(VT_UI8, -1)), KVT_VARIANT_OK, 18446744073709551616.0 },
+    };
+    for (const auto& c : doubles)
+    {
+        double value = 7.0;
+        EXPECT_EQ(c.result, c.value.GetAs(value)) << c.name;
+        EXPECT_EQ(c.result == KVT_VARIANT_OK ? c.expected : 7.0, value) << c.name;
+    }
+    const struct { KVXVariant value; const wchar_t* text; } texts[] = {
+        { KVXVariant(-42L), L"-42" },
+        { KVXVariant(0.1), L"0.1" },
+        { KVXVariant(1e300), L"1e+300" },
+        { KVXVariant(MakeSingle(0.1f)), L"0.1" },
+        { KVXVariant(MakeVariant(VT_I2, -7)), L"-7" },
+        { KVXVariant(MakeVariant(VT_UI4, 0xFFFFFFFF)), L"4294967295" },
+        { KVXVariant(MakeVariant(VT_I8, INT64_MIN)), L"-9223372036854775808" },
+        { KVXVariant(MakeVariant(VT_UI8, -1)), L"18446744073709551615" },
+    };
+    for (const auto& c : texts)
+    {
+        KVXString text;
+        EXPECT_EQ(KVT_VARIANT_OK, c.value.GetAs(text)) << Text(KVXString(c.text));
+        EXPECT_EQ(std::wstring(c.text), Text(text));
+    }
+    KVXString kept(L"kept");
+    EXPECT_EQ(KVT_VARIANT_TYPE_MISMATCH, KVXVariant(MakeVariant(VT_NULL, 0)).GetAs(kept));
+    EXPECT_EQ(L"kept", Text(kept));
 }
 
 TEST(KVXVariantConversion, ByReferenceValues)
@@ -334,10 +325,6 @@ struct MembershipCase
     bool inside;
 };
 
-void PrintTo(const MembershipCase& c, std::ostream* os) { *os << c.name; }
-
-std::string MembershipName(const testing::TestParamInfo<MembershipCase>& info) { return info.param.name; }
-
 const double kNextAboveOne = std::nextafter(1.0, 2.0);
 const double kNextBelowTen = std::nextafter(10.0, 0.0);
 
@@ -366,16 +353,11 @@ const MembershipCase kMembershipCases[] = {
     { "PointRangeExcluded", 5L, 5L, false, true, 5L, false },
 };
 
-class RangeMembership : public testing::TestWithParam<MembershipCase> {};
-
-TEST_P(RangeMembership, IsInRange)
+TEST(KVXRangeTable, IsInRange)
 {
-    const MembershipCase& c = GetParam();
-    KVXRange range = MakeRange(c.minimum, c.maximum, c.minInclude, c.maxInclude);
-    EXPECT_EQ(c.inside, range.IsInRange(c.value));
+    for (const MembershipCase& c : kMembershipCases)
+        EXPECT_EQ(c.inside, MakeRange(c.minimum, c.maximum, c.minInclude, c.maxInclude).IsInRange(c.value)) << c.name;
 }
-
-INSTANTIATE_TEST_SUITE_P(Table, RangeMembership, testing::ValuesIn(kMembershipCases), MembershipName);
 
 struct InRangeCase
 {
@@ -385,10 +367,6 @@ struct InRangeCase
     KVXVariant lowest, highest;
     bool anyInside;  // false: no value lies in the range, the ends come back as set
 };
-
-void PrintTo(const InRangeCase& c, std::ostream* os) { *os << c.name; }
-
-std::string InRangeName(const testing::TestParamInfo<InRangeCase>& info) { return info.param.name; }
 
 const InRangeCase kInRangeCases[] = {
     { "LongExcluded", 1L, 10L, false, false, 2L, 9L, true },
@@ -406,31 +384,29 @@ const InRangeCase kInRangeCases[] = {
     { "NanEnd", NAN, 1.0, true, true, NAN, 1.0, false },
 };
 
-class RangeEnds : public testing::TestWithParam<InRangeCase> {};
-
-TEST_P(RangeEnds, InRangeValues)
+TEST(KVXRangeTable, InRangeValues)
 {
-    const InRangeCase& c = GetParam();
-    KVXRange range = MakeRange(c.minimum, c.maximum, c.minInclude, c.maxInclude);
-    KVXVariant lowest = range.GetMinimumInRange();
-    KVXVariant highest = range.GetMaximumInRange();
-    double lowestValue = 0.0, highestValue = 0.0, expectedLow = 0.0, expectedHigh = 0.0;
-    lowest.GetAs(lowestValue);
-    highest.GetAs(highestValue);
-    c.lowest.GetAs(expectedLow);
-    c.highest.GetAs(expectedHigh);
-    if (std::isnan(expectedLow))
-        EXPECT_TRUE(std::isnan(lowestValue)) << lowestValue;
-    else
-        EXPECT_EQ(expectedLow, lowestValue);
-    EXPECT_EQ(expectedHigh, highestValue);
-    EXPECT_EQ(c.lowest.GetType(), lowest.GetType());
-    EXPECT_EQ(c.highest.GetType(), highest.GetType());
-    EXPECT_EQ(c.anyInside, range.IsInRange(lowest));
-    EXPECT_EQ(c.anyInside, range.IsInRange(highest));
+    for (const InRangeCase& c : kInRangeCases)
+    {
+        SCOPED_TRACE(c.name);
+        const KVXRange range = MakeRange(c.minimum, c.maximum, c.minInclude, c.maxInclude);
+        const KVXVariant lowest = range.GetMinimumInRange(), highest = range.GetMaximumInRange();
+        double low = 0.0, high = 0.0, expectedLow = 0.0, expectedHigh = 0.0;
+        lowest.GetAs(low);
+        highest.GetAs(high);
+        c.lowest.GetAs(expectedLow);
+        c.highest.GetAs(expectedHigh);
+        if (std::isnan(expectedLow))
+            EXPECT_TRUE(std::isnan(low)) << low;
+        else
+            EXPECT_EQ(expectedLow, low);
+        EXPECT_EQ(expectedHigh, high);
+        EXPECT_EQ(c.lowest.GetType(), lowest.GetType());
+        EXPECT_EQ(c.highest.GetType(), highest.GetType());
+        EXPECT_EQ(c.anyInside, range.IsInRange(lowest));
+        EXPECT_EQ(c.anyInside, range.IsInRange(highest));
+    }
 }
-
-INSTANTIATE_TEST_SUITE_P(Table, RangeEnds, testing::ValuesIn(kInRangeCases), InRangeName);
 
 TEST(KVXRangeBuilding, EmptyThenAdjust)
 {
