@@ -424,6 +424,26 @@ TEST(TypedPtrCollections, OverTheUntypedCollections)
     EXPECT_TRUE(names.Lookup(L"key", p));
     EXPECT_EQ(&x, p);
     EXPECT_FALSE(names.Lookup(L"KEY", p)) << "keys compare case-sensitively";
+    LPCTSTR pszKey = NULL;
+    EXPECT_TRUE(names.LookupKey(L"key", pszKey));
+    EXPECT_EQ(L"key", std::wstring(pszKey));
+    CMapWordToPtr words(2);
+    for (WORD w = 0; w < 50; w++)
+        words[w] = (void*)(UINT_PTR)(w + 1);
+    EXPECT_TRUE(words.Lookup(49, p));
+    EXPECT_EQ((void*)(UINT_PTR)50, p);
+    words.RemoveAll();
+    EXPECT_FALSE(words.Lookup(49, p));
+    CMapPtrToWord ptrWords;
+    ptrWords[&x] = 7;
+    WORD word = 0;
+    EXPECT_TRUE(ptrWords.Lookup(&x, word));
+    EXPECT_EQ(7, word);
+    CStringList list;
+    list.AddTail(L"x");
+    list.AddHead(L"w");
+    EXPECT_EQ(L"x", W(list.GetAt(list.Find(L"x"))));
+    EXPECT_EQ(nullptr, list.Find(L"z"));
     CStringArray strings;
     strings.Add(L"b");
     strings.InsertAt(0, L"a");

@@ -2,6 +2,8 @@
 // - reading past the end returns fewer bytes (no exception); SetLength; GetFileName/Title;
 // - Open failure fills CFileException (cause, OS error, name) and returns FALSE; the
 //   throwing constructor raises the same; a closed file throws; sharing violations;
+// - modeCreate truncates unless modeNoTruncate, read-only refuses writes, reopening and
+//   Abort release the handle;
 // - CMemFile growth by the grow-by step, seek past the end then write (a zero gap),
 //   fixed attached blocks (cannot grow), Detach handing back the block.
 #include <gtest/gtest.h>
@@ -77,6 +79,32 @@ TEST(CFileTest, ReadPastTheEndSetLengthNamesFailuresAndSharing)
     EXPECT_EQ(CFileException::fileNotFound,
               FileExceptionCause([&] { CFile thrower(missing.c_str(), CFile::modeRead); }, &thrownName));
     EXPECT_EQ(missing, W(thrownName));
+}
+
+TEST(CFileTest, ModeFlagsAndHandles)
+{
+    WCHAR dir[MAX_PATH], name[MAX_PATH];
+    ::GetTempPathW(MAX_PATH, dir);
+    ::GetTempFileNameW(dir, L"afx", 0, name);
+    CFile(name, CFile::modeCreate | CFile::modeWrite).Write("abcdef", 6);
+    EXPECT_EQ(6u, CFile(name, CFile::modeCreate | CFile::modeNoTruncate | CFile::modeRead).GetLength());
+    {
+        CFile file(name, CFile::modeRead | CFile::shareDenyWrite);
+        EXPECT_EQ(CFileException::accessDenied, FileExceptionCause([&] { file.Write("x", 1); }));
+        EXPECT_EQ(0, file.GetFilePath().CompareNoCase(name));
+        ASSERT_TRUE(file.Open(name, CFile::modeReadWrite | CFile::shareDenyNone))
+            << "reopening releases the first handle (else its sharing would block this)";
+        HANDLE h = file.m_hFile;
+        DWORD flags = 0;
+        file.Abort();
+        EXPECT_EQ(CFile::hFileNull, file.m_hFile);
+        EXPECT_FALSE(::GetHandleInformation(h, &flags)) << "Abort closed the handle";
+    }
+    EXPECT_EQ(0u, CFile(name, CFile::modeCreate | CFile::modeWrite).GetLength()) << "modeCreate truncates";
+    CFileException e;
+    EXPECT_FALSE(CFile().Open((std::wstring(name) + L".nodir\\f.txt").c_str(), CFile::modeRead, &e));
+    EXPECT_EQ(CFileException::badPath, e.m_cause);
+    ::DeleteFileW(name);
 }
 
 TEST(CMemFileTest, GrowsFillsGapsAndHandsBackBlocks)

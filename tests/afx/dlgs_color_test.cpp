@@ -1,7 +1,6 @@
 // CColorDialog (afxdlgs.h):
 //  - construction: the CHOOSECOLOR record MFC fills (size, hook, flags, RGB init only for
 //    a non-black colour, the shared custom colours);
-//  - DoModal answered OK with a colour typed into the dialog, and cancelled;
 //  - the dialog window is attached to the object while it runs: OnInitDialog of a derived
 //    class runs once with the window, OnOK is routed through the object, and the object
 //    lets go of the window afterwards;
@@ -52,28 +51,6 @@ TEST(CColorDialogTest, ConstructionFillsTheRecord)
     EXPECT_EQ(pCustom, CColorDialog::GetSavedCustomColors());
 }
 
-TEST(CColorDialogTest, OkReturnsTheTypedColour)
-{
-    CColorDialog dlg(RGB(1, 2, 3), CC_FULLOPEN);
-    DialogSteps steps({ [](HWND h) { return TypeColourAndOk(h, 10, 20, 30); } });
-    EXPECT_EQ(IDOK, dlg.DoModal());
-    EXPECT_TRUE(steps.finished());
-    EXPECT_EQ(RGB(10, 20, 30), dlg.GetColor());
-    EXPECT_EQ(nullptr, dlg.m_hWnd);
-}
-
-TEST(CColorDialogTest, CancelReturnsIdCancelAndKeepsTheColour)
-{
-    CColorDialog dlg(RGB(1, 2, 3));
-    DialogSteps steps({ [](HWND h) {
-        ::PostMessage(h, WM_COMMAND, IDCANCEL, 0);
-        return true;
-    } });
-    EXPECT_EQ(IDCANCEL, dlg.DoModal());
-    EXPECT_TRUE(steps.finished());
-    EXPECT_EQ(RGB(1, 2, 3), dlg.GetColor());
-}
-
 // A derived dialog that records what reaches the object.
 class CRecordingColorDialog : public CColorDialog
 {
@@ -112,6 +89,7 @@ public:
     std::vector<COLORREF> m_colorsAtColorOk;
 };
 
+// DoModal answered OK with a typed colour and cancelled is KVXColorDialog's test too (buttons).
 TEST(CColorDialogTest, TheObjectGetsTheDialogsMessages)
 {
     CRecordingColorDialog dlg;

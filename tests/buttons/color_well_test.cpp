@@ -378,8 +378,10 @@ TEST_F(ColorWellTest, WithoutOtherButtonItIsHiddenTheLeftKeyWrapsAndReturnOnNoth
     m_well.SetColor(0x0000FF);   // red, cell 1
     int afterLeftLeft = -2, afterRight = -2;
     BOOL otherVisible = TRUE;
+    CRect rcPopup;
     RunPopup({ [&](HWND hPopup) {
                   otherVisible = ::IsWindowVisible(::GetDlgItem(hPopup, IDC_COLOR_OTHER));
+                  ::GetWindowRect(hPopup, &rcPopup);
                   PostKeyToFocus(VK_LEFT);   // 1 -> 0
                   PostKeyToFocus(VK_LEFT);   // 0 -> 19 without the Other button
                   return true;
@@ -395,6 +397,7 @@ TEST_F(ColorWellTest, WithoutOtherButtonItIsHiddenTheLeftKeyWrapsAndReturnOnNoth
                   return true;
               } });
     EXPECT_FALSE(otherVisible);
+    EXPECT_EQ(5 * 20 + ::GetSystemMetrics(SM_CXDLGFRAME) + 2, rcPopup.Height()) << "no room for Other...";
     EXPECT_EQ(19, afterLeftLeft);
     EXPECT_EQ(-1, afterRight);
     EXPECT_EQ(Hex(0x0000FF), Hex(m_well.GetColor()));
