@@ -73,6 +73,9 @@ TEST_F(LongEdit, DisplayBaseShowsTheValueAndReadsItBack)
     EXPECT_TRUE(hex.SyntaxCheck(FALSE));
     EXPECT_FALSE(hex.GetModified());
     EXPECT_EQ(KVXLongEdit::DECIMAL, LongProbe(static_cast<KVXLongEdit::DISPLAYTYPE>(7)).GetDisplayType());
+    hex.SetDisplayType(2);   // the binary display has digits of its own
+    EXPECT_EQ("0b11111111111111111111111111111111", hex.Text());
+    EXPECT_EQ(-1, hex.CurrentLong());
 
     // A display change re-shows the value uncommitted; unknown display numbers are ignored.
     edit.SetValue(255, TRUE);

@@ -131,7 +131,7 @@ struct ScriptCase
 };
 
 const ScriptCase kScriptCases[] = {
-    { "ClickStepsOnceAndGivesTheBuddyFocus", "U ?C u ?c t10", "mid(1) inc(1)=101" },
+    { "ClickStepsOnceAndGivesTheBuddyFocus", "U ~-2,-1 ?r ?C u ?c t10", "mid(1) inc(1)=101" },
     { "DoubleClickIsASecondPress", "U u 2U ?C t6 u", "mid(1) inc(1)=101 inc(2)=102 inc(3)=103" },
     { "KeyRepeatStepsPerPressAndRestartsTheTickCount", "k^ t5 k^ t5 k^ t5 ?C K^ ?c kv Kv ?c",
       "mid(1) inc(1)=101 inc(2)=102 inc(3)=103 dec(2)=102" },

@@ -246,17 +246,18 @@ BOOL CALLBACK CancelDialog(HWND hwnd, LPARAM)
 
 void ModalScript::Tick()
 {
-    if (m_busy || m_next >= m_steps.size())
+    if (m_busy || (m_timedOut && m_next >= m_steps.size()))
         return;
     m_busy = true;
-    if (GetTickCount() - m_start > m_limit)
+    // Past the limit a dialog still up is cancelled, also one that outlives the last step.
+    if (GetTickCount() - m_start > m_limit && (m_next < m_steps.size() || IsVisibleDialog(GetActiveWindow())))
     {
         m_timedOut = true;
         m_next = m_steps.size();
         ReleaseCapture();
         EnumThreadWindows(GetCurrentThreadId(), CancelDialog, 0);
     }
-    else
+    else if (m_next < m_steps.size())
     {
         HWND active = GetActiveWindow();
         if (IsVisibleDialog(active) && m_steps[m_next](active))

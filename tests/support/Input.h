@@ -91,7 +91,8 @@ private:
 // loop of this thread dispatches, while the active window is a visible dialog (#32770).
 // A step returns false to be retried at the next tick (waiting for a nested dialog).
 // Actions that open nested modal loops must be posted, not sent. Past the time limit
-// every dialog of the thread is cancelled, so that a test cannot hang.
+// every dialog of the thread is cancelled (also one still up after the last step), so
+// that a test cannot hang.
 class ModalScript
 {
 public:
