@@ -10,12 +10,14 @@
 #include <memory>
 
 #include "ButtonsTestSupport.h"
+#include "Input.h"
+#include "MsgSequence.h"
 #include "KVXColorWell.h"
 #include "resource.h"
 
 namespace {
 
-using buttons_test::ModalScript;
+using orvane_test::ModalScript;
 
 struct DeathCase
 {
@@ -34,15 +36,15 @@ const DeathCase kDeaths[] = {
 class PopupDeathTest : public testing::TestWithParam<DeathCase>
 {
 protected:
-    static void SetUpTestSuite() { buttons_test::EnsureLibraryLoaded(); }
     void SetUp() override { Open(); }
     void TearDown() override { Close(); }
 
     void Open()
     {
-        m_parent = std::make_unique<buttons_test::TestParent>(100, 100, 400, 300);
+        m_parent = std::make_unique<buttons_test::TestParent>(100, 100);
         ASSERT_TRUE(m_well.Create(_T(""), WS_CHILD | WS_VISIBLE | BS_OWNERDRAW, CRect(20, 20, 100, 44), m_parent.get(), 7));
-        m_recorder = std::make_unique<buttons_test::ColorNotifyRecorder>(m_parent->m_hWnd);
+        m_recorder = std::make_unique<orvane_test::NotifySpy>(m_parent->m_hWnd, WM_KVX_COLORWELLCHANGED,
+                                                             sizeof(KVXColorWellNotify), false, WM_KVX_COLORWELLCHANGED);
     }
     void Close()
     {
@@ -53,7 +55,7 @@ protected:
 
     std::unique_ptr<buttons_test::TestParent> m_parent;
     KVXColorWell m_well;
-    std::unique_ptr<buttons_test::ColorNotifyRecorder> m_recorder;
+    std::unique_ptr<orvane_test::NotifySpy> m_recorder;
 };
 
 TEST_P(PopupDeathTest, LoopsEndWithTheWellAndANewWellWorks)
@@ -89,7 +91,7 @@ TEST_P(PopupDeathTest, LoopsEndWithTheWellAndANewWellWorks)
     ModalScript pick({ [](HWND hDialog) { return ::PostMessage(hDialog, WM_LBUTTONUP, 0, MAKELPARAM(50, 30)) != FALSE; } });
     m_well.DoColorWellDlg();
     ASSERT_EQ(1, m_recorder->count());
-    EXPECT_EQ(RGB(255, 255, 255), m_recorder->records()[0].clrColor);
+    EXPECT_EQ(RGB(255, 255, 255), reinterpret_cast<const KVXColorWellNotify*>(m_recorder->payloads()[0].data())->clrColor);
 }
 
 INSTANTIATE_TEST_SUITE_P(Buttons, PopupDeathTest, testing::ValuesIn(kDeaths),

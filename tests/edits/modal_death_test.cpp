@@ -6,7 +6,6 @@
 #include "edit_harness.h"
 
 #include "CallLater.h"
-#include "spin_test_fixture.h"
 
 namespace {
 
@@ -24,7 +23,7 @@ std::string DeathName(const testing::TestParamInfo<Death>& info)
 class LoopDeath : public testing::TestWithParam<Death>
 {
 protected:
-    static void SetUpTestSuite() { EnsureLibraryLoaded(); }
+    static void SetUpTestSuite() { orvane_test::LoadLibraryOnce(); }
     void TearDown() override { dlg.DestroyWindow(); }
 
     // The dialog and the edit in control nId, each made again if its window died.
@@ -46,7 +45,7 @@ protected:
     }
 
     TestDialog dlg;
-    spin_test::RecordingLongEdit edit;
+    LongProbe edit;
 };
 
 using ErrorBoxDeath = LoopDeath;

@@ -17,7 +17,7 @@ struct CountingLongEdit : KVXLongEdit
 
 TEST(NumericEditCreate, InitialisesOnceWhetherCreatedOrSubclassed)
 {
-    EnsureLibraryLoaded();
+    orvane_test::LoadLibraryOnce();
     TestDialog dlg;
     ASSERT_TRUE(dlg.Open());
     CountingLongEdit created;

@@ -48,7 +48,7 @@ TEST_P(LoopDeathTest, LoopEndsAtOnceAndANewTreeWorks)
     EXPECT_EQ("", m_parent.Trace());
     EXPECT_EQ("", m_tree.m_hookTrace);
 
-    ASSERT_TRUE(!c.topLevel || m_parent.CreateParent(60, 60, 320, 420));
+    ASSERT_TRUE(!c.topLevel || CreateParent());
     CreateTree();
     Build(kSmallTree);
     if (c.band)
