@@ -1,10 +1,7 @@
-// The extended list's geometry without a window, as named tables:
-// - the highlight rectangle per type (label pulled in behind its text, all columns from
-//   the label, the whole row to the client's edge, negative types);
-// - which rows are highlighted, text alignment, small image styles, the text rectangle;
-// - the rows and the column a point falls in: the partly visible row, borders to the left
-//   column, the client-edge rule;
-// - where a title tip starts, the check-box cycle, the fill width, the whole-row repaint.
+// The extended list's geometry without a window, as named tables: the highlight rectangle
+// per type; highlighted rows, alignment, image styles, the text rectangle; the rows and the
+// column under a point (partly visible row, borders, client edge); where a title tip starts;
+// the check-box cycle; the fill width; the whole-row repaint.
 #include <gtest/gtest.h>
 
 #include "ListGeometry.h"
@@ -23,15 +20,16 @@ std::string Str(const RECT& r) { return testing::PrintToString(std::vector<LONG>
 template <typename Case>
 std::string CaseName(const testing::TestParamInfo<Case>& info) { return info.param.name; }
 
-// bounds (0, 20, 300, 37), label (34, 20, 100, 37), offset 6, client right 400.
-struct HighlightCase { const char* name; int type; int textWidth; RECT expected; };
+// Row from 0 to boundsRight, label (34, 20, 100, 37), offset 6, client right 400.
+struct HighlightCase { const char* name; int type; int boundsRight; int textWidth; RECT expected; };
 
 const HighlightCase kHighlightCases[] = {
-    { "LabelPulledInBehindItsText", kLabelOnly, 30, { 34, 20, 70, 37 } },
-    { "LabelWhoseTextFillsItKeepsItsEdge", kLabelOnly, 61, { 34, 20, 100, 37 } },
-    { "AllColumnsFromTheLabel", kAllColumns, 30, { 34, 20, 300, 37 } },
-    { "WholeRowToTheClientEdge", kWholeRow, 30, { 34, 20, 400, 37 } },
-    { "NegativeTypeIsTheLabel", -1, 30, { 34, 20, 100, 37 } },
+    { "LabelPulledInBehindItsText", kLabelOnly, 300, 30, { 34, 20, 70, 37 } },
+    { "LabelWhoseTextFillsItKeepsItsEdge", kLabelOnly, 300, 61, { 34, 20, 100, 37 } },
+    { "AllColumnsFromTheLabel", kAllColumns, 300, 30, { 34, 20, 300, 37 } },
+    { "WholeRowToTheClientEdge", kWholeRow, 300, 30, { 34, 20, 400, 37 } },
+    { "WholeRowOfColumnsWiderThanTheClient", kWholeRow, 500, 30, { 34, 20, 500, 37 } },
+    { "NegativeTypeIsTheLabel", -1, 300, 30, { 34, 20, 100, 37 } },
 };
 
 class HighlightRectTest : public testing::TestWithParam<HighlightCase> {};
@@ -39,23 +37,16 @@ class HighlightRectTest : public testing::TestWithParam<HighlightCase> {};
 TEST_P(HighlightRectTest, Rectangle)
 {
     const HighlightCase& c = GetParam();
-    EXPECT_EQ(Str(c.expected), Str(HighlightRect(c.type, { 0, 20, 300, 37 }, { 34, 20, 100, 37 }, c.textWidth, 6, 400)));
+    EXPECT_EQ(Str(c.expected), Str(HighlightRect(c.type, { 0, 20, c.boundsRight, 37 }, { 34, 20, 100, 37 }, c.textWidth, 6, 400)));
 }
 
 INSTANTIATE_TEST_SUITE_P(Types, HighlightRectTest, testing::ValuesIn(kHighlightCases), CaseName<HighlightCase>);
 
-TEST(ListGeometryTest, WholeRowKeepsColumnsWiderThanTheClient)
-{
-    EXPECT_EQ(Str({ 34, 20, 500, 37 }), Str(HighlightRect(kWholeRow, { 0, 20, 500, 37 }, { 34, 20, 100, 37 }, 30, 6, 400)));
-}
-
 TEST(ListGeometryTest, HighlightedRows)
 {
     const struct { UINT state; bool focus, showSelectionAlways, highlighted; } cases[] = {
-        { LVIS_SELECTED, true, false, true },
-        { LVIS_SELECTED, false, false, false },
-        { LVIS_SELECTED, false, true, true },
-        { LVIS_DROPHILITED, false, false, true },
+        { LVIS_SELECTED, true, false, true }, { LVIS_SELECTED, false, false, false },
+        { LVIS_SELECTED, false, true, true }, { LVIS_DROPHILITED, false, false, true },
         { LVIS_FOCUSED, true, true, false },
     };
     for (const auto& c : cases)
