@@ -380,7 +380,7 @@ int KVXListCtrlEx::FindCell(const CPoint& point, bool bClientEdge, RECT* pCellRe
         if (!GetItemRect(nItem, &rectBounds, LVIR_BOUNDS) || !rectBounds.PtInRect(point))
             continue;
         const int nColumns = GetColumnCount();
-        std::vector<int> widths(static_cast<size_t>(std::max(nColumns, 0)));
+        std::vector<int> widths(static_cast<size_t>((std::max)(nColumns, 0)));
         for (int c = 0; c < nColumns; ++c)
             widths[c] = GetColumnWidth(c);
         CRect rectClient;

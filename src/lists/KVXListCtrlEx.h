@@ -102,6 +102,8 @@ protected:
     // elsewhere shows it the same way: FindTitleTipCell finds the cell whose text the
     // pointer is over (title tips enabled, no button or key down, at or right of where the
     // text starts); ShowTitleTip lets the tip show the text over that cell when it is cut off.
+    // Such a list handles WM_MOUSEMOVE with these two and CListCtrl::OnMouseMove, not with
+    // this class's OnMouseMove, which shows the cell's own text.
     struct TitleTipCell
     {
         int nItem;

@@ -3,7 +3,7 @@
 
 #include <commctrl.h>
 
-#include <algorithm>
+#include <algorithm>   // (std::min) and (std::max): safe from the min and max macros of windows.h
 
 namespace ListGeometry {
 
@@ -25,14 +25,14 @@ RECT HighlightRect(int type, const RECT& bounds, const RECT& label, int textWidt
     switch (type)
     {
     case kLabelOnly:
-        rc.right = std::min(label.right, static_cast<LONG>(label.left + textWidth + offset));
+        rc.right = (std::min)(label.right, static_cast<LONG>(label.left + textWidth + offset));
         break;
     case kAllColumns:
     case kWholeRow:
         rc = bounds;
         rc.left = label.left;
         if (type == kWholeRow)
-            rc.right = std::max(bounds.right, static_cast<LONG>(clientRight));
+            rc.right = (std::max)(bounds.right, static_cast<LONG>(clientRight));
         break;
     default:
         break;
@@ -75,7 +75,7 @@ RECT CellTextRect(const RECT& cell, bool hasImage, int imageShift, int offset)
 
 RowRange ScannedRows(int topIndex, int countPerPage, int itemCount)
 {
-    RowRange rows = { topIndex, std::min(topIndex + countPerPage, itemCount - 1) };
+    RowRange rows = { topIndex, (std::min)(topIndex + countPerPage, itemCount - 1) };
     return rows;
 }
 
@@ -92,7 +92,7 @@ ColumnHit FindColumn(int x, int rowLeft, const int* widths, int count, int clien
                 return hit;
             hit.column = c;
             hit.left = left;
-            hit.right = clientRight != kNoClientEdge ? std::min(right, clientRight) : right;
+            hit.right = clientRight != kNoClientEdge ? (std::min)(right, clientRight) : right;
             return hit;
         }
         left = right;
@@ -126,7 +126,7 @@ FitResult FitColumn(const ColumnFacts* columns, int count, int clientWidth)
     }
     // Less than nothing left is nothing: a negative width would be refused, or taken
     // for one of the list view's automatic sizes (-1, -2).
-    fit.width = std::max(0, clientWidth - othersWidth);
+    fit.width = (std::max)(0, clientWidth - othersWidth);
     return fit;
 }
 
@@ -135,7 +135,7 @@ bool WholeRowRepaintRect(const RECT& rowBounds, const RECT& client, const RECT& 
     if (rowBounds.right >= client.right)
         return false;
     *pRepaint = clipBox;
-    pRepaint->left = std::min(clipBox.left, rowBounds.right - 1);
+    pRepaint->left = (std::min)(clipBox.left, rowBounds.right - 1);
     pRepaint->right = client.right;
     return true;
 }
