@@ -1,7 +1,7 @@
 // The extended list's geometry without a window, as named tables: the highlight rectangle
-// per type; highlighted rows, alignment, image styles, the text rectangle; the rows and the
-// column under a point (partly visible row, borders, client edge); where a title tip starts;
-// the check-box cycle; the fill width; the whole-row repaint.
+// per type; highlighted rows, alignment, image styles, the text rectangle; the column under
+// a point (borders, client edge); where a title tip starts; the check-box cycle; the fill
+// width; the whole-row repaint.
 #include <gtest/gtest.h>
 
 #include "ListGeometry.h"
@@ -68,20 +68,6 @@ TEST(ListGeometryTest, AlignmentImageStyleAndTextRectangle)
 
     EXPECT_EQ(Str({ 126, 20, 194, 37 }), Str(CellTextRect({ 100, 20, 200, 37 }, true, 20, 6)));
     EXPECT_EQ(Str({ 106, 20, 194, 37 }), Str(CellTextRect({ 100, 20, 200, 37 }, false, 20, 6)));
-}
-
-TEST(ListGeometryTest, ScannedRowsIncludeThePartlyVisibleOne)
-{
-    const struct { int top, perPage, count, first, last; } cases[] = {
-        { 5, 10, 100, 5, 15 },   // rows 5..14 fully visible, 15 partly
-        { 5, 10, 12, 5, 11 },
-        { 0, 10, 0, 0, -1 },
-    };
-    for (const auto& c : cases)
-    {
-        const RowRange rows = ScannedRows(c.top, c.perPage, c.count);
-        EXPECT_EQ(std::make_pair(c.first, c.last), std::make_pair(rows.first, rows.last)) << "count " << c.count;
-    }
 }
 
 // Columns 50, 0, 70 and 40 wide from row left 10: borders at 60, 130 and 170.
