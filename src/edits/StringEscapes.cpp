@@ -83,7 +83,7 @@ bool ComposePaste(const std::wstring& text, int selStart, int selEnd, const std:
         return false;
 
     const size_t room = static_cast<size_t>(maxChars - restLength);
-    const std::wstring inserted = clip.substr(0, std::min(clip.size(), room));
+    const std::wstring inserted = clip.substr(0, (std::min)(clip.size(), room));
     rest.insert(static_cast<size_t>(start), inserted);
     result.text = rest;
     result.caret = start + static_cast<int>(inserted.size());

@@ -116,7 +116,7 @@ Placement LayoutToolTip(const RECT& area, POINT point, const wchar_t* text, int 
     MoveOntoLeftEdge(tip, monitor);
     if (tip.right > monitor.right && tip.left < monitor.right)
     {
-        tip.left = std::max(monitor.left, tip.left - (tip.right - monitor.right));
+        tip.left = (std::max)(monitor.left, tip.left - (tip.right - monitor.right));
         tip.right = monitor.right;
     }
 
@@ -126,7 +126,7 @@ Placement LayoutToolTip(const RECT& area, POINT point, const wchar_t* text, int 
             return placement;
         if (tip.bottom > monitor.bottom)
         {
-            tip.top = std::max(monitor.top, tip.top - (tip.bottom - monitor.bottom));
+            tip.top = (std::max)(monitor.top, tip.top - (tip.bottom - monitor.bottom));
             tip.bottom = monitor.bottom;
         }
         // Keep the area readable: above it with a gap of 5 pixels, where there is room.

@@ -150,7 +150,7 @@ POINT ContentToClient(POINT content, int hScrollPos, int vScrollPos, int itemHei
 RECT BandRect(POINT startContent, int hScrollPos, int vScrollPos, int itemHeight, POINT p)
 {
     const POINT s = ContentToClient(startContent, hScrollPos, vScrollPos, itemHeight);
-    return RECT{ std::min(s.x, p.x), std::min(s.y, p.y), std::max(s.x, p.x), std::max(s.y, p.y) };
+    return RECT{ (std::min)(s.x, p.x), (std::min)(s.y, p.y), (std::max)(s.x, p.x), (std::max)(s.y, p.y) };
 }
 
 bool BandTouches(const RECT& band, const RECT& item)
