@@ -143,26 +143,29 @@ CRect KVXComboBoxListCtrlEx::GetComboBoxRect(int nRow, int nColumn, long)
 /////////////////////////////////////////////////////////////////////////////
 // Keeping the boxes over their cells
 
+void KVXComboBoxListCtrlEx::PlaceComboBox(int nRow, KVXSubItemComboBox* pCombo)
+{
+    const CRect rect = GetComboBoxRect(nRow, m_nComboColumn, 0);
+    if (rect.IsRectEmpty())
+        return;     // no combo column any more, or no such row: the box stays as it is
+    // The same extent as at creation: the column's width.
+    pCombo->SetHorizontalExtent(static_cast<UINT>(GetColumnWidth(m_nComboColumn)));
+    const CRect rectWindow = ComboListGeometry::DropDownWindowRect(rect);
+    pCombo->MoveWindow(rectWindow.left, rectWindow.top, rectWindow.Width(), rectWindow.Height(), TRUE);
+    pCombo->SetItemHeight(-1, static_cast<UINT>(rect.Height()));
+}
+
 LRESULT KVXComboBoxListCtrlEx::OnResizeColumn(WPARAM, LPARAM)
 {
-    const int nCount = GetItemCount();
-    POSITION pos = m_mapComboBoxes.GetStartPosition();
-    while (pos != NULL)
+    // Moving a combo box costs about a millisecond: only the boxes in view are moved, the
+    // others when they come into view (OnEnsureVisibility).
+    const ComboListGeometry::RowRange rows =
+        ComboListGeometry::VisibleRows(GetTopIndex(), GetCountPerPage(), GetItemCount());
+    for (int nRow = rows.first; nRow <= rows.last; ++nRow)
     {
-        WORD nRow = 0;
-        void* pValue = NULL;
-        m_mapComboBoxes.GetNextAssoc(pos, nRow, pValue);
-        KVXSubItemComboBox* pCombo = static_cast<KVXSubItemComboBox*>(pValue);
-        if (nRow >= nCount || pCombo->m_hWnd == NULL)
-            continue;
-        const CRect rect = GetComboBoxRect(nRow, m_nComboColumn, 0);
-        if (rect.IsRectEmpty())
-            continue;   // no combo column any more: the box stays as it is
-        // The same extent as at creation: the column's width.
-        pCombo->SetHorizontalExtent(static_cast<UINT>(GetColumnWidth(m_nComboColumn)));
-        const CRect rectWindow = ComboListGeometry::DropDownWindowRect(rect);
-        pCombo->MoveWindow(rectWindow.left, rectWindow.top, rectWindow.Width(), rectWindow.Height(), TRUE);
-        pCombo->SetItemHeight(-1, static_cast<UINT>(rect.Height()));
+        KVXSubItemComboBox* pCombo = FindComboBox(nRow);
+        if (pCombo != NULL && pCombo->m_hWnd != NULL && (pCombo->GetStyle() & WS_VISIBLE))
+            PlaceComboBox(nRow, pCombo);
     }
     Invalidate(TRUE);
     UpdateWindow();
@@ -191,6 +194,7 @@ LRESULT KVXComboBoxListCtrlEx::OnEnsureVisibility(WPARAM wParam, LPARAM lParam)
         }
         else if (!bShown)
         {
+            PlaceComboBox(nRow, pCombo);
             pCombo->ShowWindow(SW_SHOW);
             RedrawItems(nRow, nRow);
         }
@@ -219,8 +223,9 @@ void KVXComboBoxListCtrlEx::HScrollComboBoxesIntoView()
         const CRect rectWindow =
             ComboListGeometry::DropDownWindowRect(ComboListGeometry::RowComboRect(rect, rows.first, nRow, nRowHeight));
         pCombo->MoveWindow(rectWindow.left, rectWindow.top, rectWindow.Width(), rectWindow.Height(), TRUE);
-        // The field height again, so that the box lays out its field for the new place.
-        pCombo->SetItemHeight(-1, static_cast<UINT>(pCombo->GetItemHeight(-1)));
+        // The field height again, so that the box lays out its field for the new place;
+        // from the row, as Wine reads it back two pixels higher than it was set.
+        pCombo->SetItemHeight(-1, static_cast<UINT>(rect.Height()));
     }
     RedrawItems(rows.first, rows.last + 1);
 }

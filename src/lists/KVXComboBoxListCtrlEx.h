@@ -65,6 +65,8 @@ protected:
 private:
     KVXSubItemComboBox* CreateSubItemComboBox(int nRow, int nColumn);
     CRect GetComboBoxRect(int nRow, int nColumn, long lUnused);
+    // Lays the box over its row's cell of the combo column.
+    void PlaceComboBox(int nRow, KVXSubItemComboBox* pCombo);
     void HScrollComboBoxesIntoView();
     KVXSubItemComboBox* FindComboBox(int nRow) const;
     void PostRelayout();
