@@ -206,7 +206,9 @@ TEST_F(ComboListTest, KeysScrollingAndTheWheelPlaceTheBoxesInView)
     m_list.SendMessage(WM_VSCROLL, SB_ENDSCROLL);
     PumpUntilIdle(1000);
     EXPECT_EQ(none, Misplaced(kRows)) << "scroll bar";
-    m_list.SendMessage(WM_MOUSEWHEEL, MAKEWPARAM(0, -WHEEL_DELTA));
+    const int beforeWheel = m_list.GetTopIndex();
+    m_list.SendMessage(WM_MOUSEWHEEL, MAKEWPARAM(0, WHEEL_DELTA));
+    EXPECT_GT(beforeWheel, m_list.GetTopIndex());
     PumpUntilIdle(1000);
     EXPECT_EQ(none, Misplaced(kRows)) << "wheel";
     const int rowLeft = RowRect(0).left;
