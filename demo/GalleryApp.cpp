@@ -1,7 +1,8 @@
 // The gallery: a host application that shows each family of controls on a page
 // of its own. With "/screenshots <folder>" it paints every page once, writes a
-// bitmap of it into the folder (page01-library.bmp, ...) and quits (used where
-// there is no display).
+// bitmap of it into the folder (page01-library.bmp, ...; a page with variants adds
+// one picture per variant, e.g. page04-list-type0.bmp) and quits (used where there
+// is no display).
 #include <afxwin.h>
 #include <commctrl.h>
 
@@ -116,6 +117,7 @@ public:
     BOOL CreateGallery();
     void ShowPage(int index);
     int GetPageCount() const { return static_cast<int>(m_pages.GetSize()); }
+    CGalleryPage* GetPage(int index) const { return static_cast<CGalleryPage*>(m_pages.GetAt(index)); }
     LPCTSTR GetPageTitle(int index) const { return static_cast<CGalleryPage*>(m_pages.GetAt(index))->GetTitle(); }
 
 protected:
@@ -138,7 +140,7 @@ BEGIN_MESSAGE_MAP(CGalleryWnd, CWnd)
     ON_WM_CREATE()
     ON_WM_DESTROY()
     ON_WM_SIZE()
-    ON_NOTIFY(TCN_SELCHANGE, 1, OnTabChange)
+    ON_NOTIFY(TCN_SELCHANGE, 1, &CGalleryWnd::OnTabChange)
 END_MESSAGE_MAP()
 
 BOOL CGalleryWnd::CreateGallery()
@@ -286,23 +288,28 @@ void CGalleryApp::WriteScreenshots(CGalleryWnd* wnd, const CString& folder)
     for (int i = 0; i < wnd->GetPageCount(); ++i)
     {
         wnd->ShowPage(i);
-        wnd->RedrawWindow(nullptr, nullptr, RDW_INVALIDATE | RDW_ERASE | RDW_UPDATENOW | RDW_ALLCHILDREN);
-        // Let posted work (layouts, timers of the pages) settle before the picture.
-        DWORD until = ::GetTickCount() + 300;
-        MSG msg;
-        while (::GetTickCount() < until)
+        CString name = FileNameOf(wnd->GetPageTitle(i));
+        for (int variant = -1; variant < wnd->GetPage(i)->GetScreenshotVariantCount(); ++variant)
         {
-            while (::PeekMessageW(&msg, nullptr, 0, 0, PM_REMOVE))
+            if (variant >= 0)
+                name = FileNameOf(wnd->GetPageTitle(i)) + _T("-") + wnd->GetPage(i)->ShowScreenshotVariant(variant);
+            wnd->RedrawWindow(nullptr, nullptr, RDW_INVALIDATE | RDW_ERASE | RDW_UPDATENOW | RDW_ALLCHILDREN);
+            // Let posted work (layouts, timers of the pages) settle before the picture.
+            DWORD until = ::GetTickCount() + 300;
+            MSG msg;
+            while (::GetTickCount() < until)
             {
-                ::TranslateMessage(&msg);
-                ::DispatchMessageW(&msg);
+                while (::PeekMessageW(&msg, nullptr, 0, 0, PM_REMOVE))
+                {
+                    ::TranslateMessage(&msg);
+                    ::DispatchMessageW(&msg);
+                }
+                ::Sleep(10);
             }
-            ::Sleep(10);
+            wnd->RedrawWindow(nullptr, nullptr, RDW_INVALIDATE | RDW_ERASE | RDW_UPDATENOW | RDW_ALLCHILDREN);
+            CString path;
+            path.Format(_T("%s\\page%02d-%s.bmp"), static_cast<LPCTSTR>(folder), i + 1, static_cast<LPCTSTR>(name));
+            SaveClientBitmap(wnd->GetSafeHwnd(), path);
         }
-        wnd->RedrawWindow(nullptr, nullptr, RDW_INVALIDATE | RDW_ERASE | RDW_UPDATENOW | RDW_ALLCHILDREN);
-        CString path;
-        path.Format(_T("%s\\page%02d-%s.bmp"), static_cast<LPCTSTR>(folder), i + 1,
-                    static_cast<LPCTSTR>(FileNameOf(wnd->GetPageTitle(i))));
-        SaveClientBitmap(wnd->GetSafeHwnd(), path);
     }
 }

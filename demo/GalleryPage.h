@@ -11,6 +11,11 @@ public:
     virtual LPCTSTR GetTitle() const = 0;
     // Creates the page's controls; the page window exists and has its final size.
     virtual void CreateControls() = 0;
+    // Screenshot mode: further pictures of the page in other states. ShowScreenshotVariant
+    // puts the page into variant nVariant (0 to the count - 1) and returns the suffix of
+    // its file name.
+    virtual int GetScreenshotVariantCount() const { return 0; }
+    virtual CString ShowScreenshotVariant(int /*nVariant*/) { return CString(); }
 };
 
 typedef CGalleryPage* (*GalleryPageFactory)();

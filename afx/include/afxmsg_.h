@@ -27,7 +27,7 @@ enum AfxSig
     AfxSig_vw,          // void (UINT)
     AfxSig_vb,          // void (BOOL)
     AfxSig_vt,          // void (UINT_PTR)
-    AfxSig_vww,         // void (UINT, UINT)
+    AfxSig_vwwx,        // void (UINT, UINT)        LOWORD, HIWORD of wParam
     AfxSig_vbw,         // void (BOOL, UINT)
     AfxSig_vvii,        // void (int, int)          from lParam
     AfxSig_vwww,        // void (UINT, UINT, UINT)  key messages
@@ -43,11 +43,9 @@ enum AfxSig
     AfxSig_vws,         // void (UINT, LPCTSTR)     WM_SETTINGCHANGE
     AfxSig_vs,          // void (T*)                pointer in lParam
     AfxSig_vOWNER,      // void (int, T*)           owner-draw family, result TRUE
-    AfxSig_bOWNER,      // BOOL (int, T*)
     AfxSig_wv,          // UINT ()
     AfxSig_bv,          // BOOL ()
     AfxSig_vCALC,       // void (BOOL, NCCALCSIZE_PARAMS*)
-    AfxSig_vWww,        // void (CWnd*, UINT, UINT)
     AfxSig_bHELPINFO,   // BOOL (HELPINFO*)       WM_HELP
 
     // command and notification routing (OnCmdMsg)
@@ -279,10 +277,10 @@ enum AfxSig
     { WM_COMPAREITEM + WM_REFLECT_BASE, 0, 0, 0, AfxSig_is, \
       AFX_WNDMSG(int (AFX_MSG_CALL CWnd::*)(LPCOMPAREITEMSTRUCT), &ThisClass::CompareItem) },
 #define ON_WM_HSCROLL_REFLECT() \
-    { WM_HSCROLL + WM_REFLECT_BASE, 0, 0, 0, AfxSig_vww, \
+    { WM_HSCROLL + WM_REFLECT_BASE, 0, 0, 0, AfxSig_vwwx, \
       AFX_WNDMSG(void (AFX_MSG_CALL CWnd::*)(UINT, UINT), &ThisClass::HScroll) },
 #define ON_WM_VSCROLL_REFLECT() \
-    { WM_VSCROLL + WM_REFLECT_BASE, 0, 0, 0, AfxSig_vww, \
+    { WM_VSCROLL + WM_REFLECT_BASE, 0, 0, 0, AfxSig_vwwx, \
       AFX_WNDMSG(void (AFX_MSG_CALL CWnd::*)(UINT, UINT), &ThisClass::VScroll) },
 #define ON_WM_PARENTNOTIFY_REFLECT() \
     { WM_PARENTNOTIFY + WM_REFLECT_BASE, 0, 0, 0, AfxSig_vwl, \

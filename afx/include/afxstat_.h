@@ -142,14 +142,6 @@ public:
     // UpdateData blocks control notifications to this window
     HWND m_hLockoutNotifyWindow;
 
-    // Depth of nested modal loops; temporary objects older than the innermost
-    // loop belong to the code that entered it and are kept.
-    int m_nModalDepth;
-    // Set by DoModal before it creates the dialog: temporaries made from there
-    // on (OnInitDialog included) belong to the dialog's loop. 0: none.
-    unsigned m_nModalTempFloor;
-    CWnd* m_pModalTempFloorWnd;         // the dialog the floor is for
-
     // AfxRegisterWndClass returns a name kept here
     TCHAR m_szTempClassName[128];
 };

@@ -16,9 +16,7 @@
 #ifndef RT_DLGINIT
 #define RT_DLGINIT MAKEINTRESOURCE(240)
 #endif
-#if __has_include("afxcoll.h")
 #include "afxcoll.h"
-#endif
 
 class CCmdTarget;
 class CCmdUI;

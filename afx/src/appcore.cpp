@@ -211,7 +211,7 @@ BOOL AFXAPI AfxWinInit(HINSTANCE hInstance, HINSTANCE hPrevInstance, LPTSTR lpCm
 
 void AFXAPI AfxWinTerm()
 {
-    AfxDeleteTempObjects(0);
+    AfxDeleteTempObjects();
     // ends OLE when AfxOleInit started it
     CWinThread* pThread = AfxGetApp();
     if (pThread != NULL && pThread->m_lpfnOleTermOrFreeLib != NULL)

@@ -198,13 +198,9 @@ INT_PTR CDialog::DoModal()
         bEnableParent = TRUE;
     }
 
-    _AFX_THREAD_STATE* pThreadState = AfxGetThreadState();
     CWnd* pParentWnd = CWnd::FromHandle(hWndParent);
     TRY
     {
-        // what the dialog makes from here on is freed by its own loop
-        pThreadState->m_nModalTempFloor = afxMapHWND(TRUE)->CurrentGeneration() + 1;
-        pThreadState->m_pModalTempFloorWnd = this;
         if (CreateDlgIndirect(lpDialogTemplate, pParentWnd, hInst))
         {
             if (m_nFlags & WF_CONTINUEMODAL)
@@ -225,11 +221,6 @@ INT_PTR CDialog::DoModal()
         m_nModalResult = -1;
     }
     END_CATCH_ALL
-    if (pThreadState->m_pModalTempFloorWnd == this)
-    {
-        pThreadState->m_nModalTempFloor = 0;
-        pThreadState->m_pModalTempFloorWnd = NULL;
-    }
 
     if (bEnableParent)
         ::EnableWindow(hWndParent, TRUE);

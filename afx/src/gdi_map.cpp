@@ -205,11 +205,14 @@ BOOL CGdiObject::Attach(HGDIOBJ hObject)
 {
     if (hObject == NULL)
         return FALSE;
+    ASSERT(m_hObject == NULL);      // only attach once, detach on destroy
     if (hObject == m_hObject)
         return TRUE;
-    // Creating into an object that already holds a handle replaces it.
+    // As in MFC the held handle is not deleted: the caller leaks it. It is taken out
+    // of the map, though, which would otherwise keep naming this object for it and
+    // hand out a dangling pointer once this object is gone.
     if (m_hObject != NULL)
-        DeleteObject();
+        Detach();
 
     GdiHandleMaps& maps = Maps();
     if (ThreadTemps* pTemps = maps.Temps(false))

@@ -1,10 +1,9 @@
 // CHandleMap: per-thread map from window handles to CWnd objects.
 #include "wndimpl.h"
-#include <vector>
 
 CHandleMap::~CHandleMap()
 {
-    DeleteTemp(0);
+    DeleteTemp();
 }
 
 CWnd* CHandleMap::LookupPermanent(HWND hWnd) const
@@ -16,7 +15,7 @@ CWnd* CHandleMap::LookupPermanent(HWND hWnd) const
 CWnd* CHandleMap::LookupTemporary(HWND hWnd) const
 {
     auto it = m_temporaryMap.find(hWnd);
-    return it == m_temporaryMap.end() ? NULL : it->second.pWnd;
+    return it == m_temporaryMap.end() ? NULL : it->second;
 }
 
 CWnd* CHandleMap::FromHandle(HWND hWnd)
@@ -30,7 +29,7 @@ CWnd* CHandleMap::FromHandle(HWND hWnd)
 
     CWnd* pTemp = new CWnd;
     pTemp->m_hWnd = hWnd;
-    m_temporaryMap[hWnd] = TempEntry{pTemp, ++m_nGeneration};
+    m_temporaryMap[hWnd] = pTemp;
     return pTemp;
 }
 
@@ -44,24 +43,15 @@ void CHandleMap::RemoveHandle(HWND hWnd)
     m_permanentMap.erase(hWnd);
 }
 
-void CHandleMap::DeleteTemp(unsigned nAfter)
+void CHandleMap::DeleteTemp()
 {
-    // Collect first: a destructor must not see the map half-changed.
-    std::vector<CWnd*> doomed;
-    for (auto it = m_temporaryMap.begin(); it != m_temporaryMap.end();)
+    // Taken out first: a destructor must not see the map half-changed.
+    std::unordered_map<HWND, CWnd*> doomed;
+    doomed.swap(m_temporaryMap);
+    for (auto& entry : doomed)
     {
-        if (it->second.nGeneration > nAfter)
-        {
-            doomed.push_back(it->second.pWnd);
-            it = m_temporaryMap.erase(it);
-        }
-        else
-            ++it;
-    }
-    for (CWnd* pTemp : doomed)
-    {
-        pTemp->m_hWnd = NULL;   // the window is not ours to destroy
-        delete pTemp;
+        entry.second->m_hWnd = NULL;   // the window is not ours to destroy
+        delete entry.second;
     }
 }
 

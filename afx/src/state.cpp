@@ -1,9 +1,6 @@
 // Module state, thread state and the look-ups that walk the extension DLL chain.
 #include "wndimpl.h"
-#if __has_include(<afxcmn.h>)
 #include <afxcmn.h>
-#define AFX_HAVE_IMAGELIST_TEMPS 1
-#endif
 #include <string>
 
 /////////////////////////////////////////////////////////////////////////////
@@ -64,7 +61,7 @@ AFX_MODULE_THREAD_STATE::AFX_MODULE_THREAD_STATE()
 
 _AFX_THREAD_STATE::_AFX_THREAD_STATE()
     : m_pWndInit(NULL), m_hHookOldCbtFilter(NULL), m_nMsgLast(0),
-      m_hLockoutNotifyWindow(NULL), m_nModalDepth(0), m_nModalTempFloor(0), m_pModalTempFloorWnd(NULL)
+      m_hLockoutNotifyWindow(NULL)
 {
     memset(&m_lastSentMsg, 0, sizeof(m_lastSentMsg));
     memset(&m_msgCur, 0, sizeof(m_msgCur));
@@ -125,20 +122,13 @@ void AFXAPI AfxTermModuleState()
 /////////////////////////////////////////////////////////////////////////////
 // Temporary objects
 
-void AFXAPI AfxDeleteTempObjects(unsigned nAfter)
+void AFXAPI AfxDeleteTempObjects()
 {
     if (CHandleMap* pMap = afxMapHWND())
-        pMap->DeleteTemp(nAfter);
-    if (nAfter == 0)
-    {
-        // These maps keep no generations: they are emptied only when nothing
-        // older than the current message can hold one of their objects.
-#ifdef AFX_HAVE_IMAGELIST_TEMPS
-        CImageList::DeleteTempMap();
-#endif
-        CDC::DeleteTempMap();
-        CGdiObject::DeleteTempMap();
-    }
+        pMap->DeleteTemp();
+    CImageList::DeleteTempMap();
+    CDC::DeleteTempMap();
+    CGdiObject::DeleteTempMap();
 }
 
 void AFXAPI AfxLockTempMaps()
@@ -154,7 +144,7 @@ BOOL AFXAPI AfxUnlockTempMaps(BOOL bDeleteTemps)
     if (--pState->m_nTempMapLock == 0)
     {
         if (bDeleteTemps)
-            AfxDeleteTempObjects(0);
+            AfxDeleteTempObjects();
         return TRUE;
     }
     return FALSE;

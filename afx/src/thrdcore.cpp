@@ -105,8 +105,9 @@ BOOL CWinThread::PumpMessage()
     return TRUE;
 }
 
-// From the message's window up to its top-level window, each framework object
-// may take the message. When the main window is elsewhere, it gets a last look.
+// From the message's window up through parents and owners to the main window,
+// each framework object may take the message. A window whose chain does not reach
+// the main window (a modeless dialog of its own) gives the main window a last look.
 BOOL CWinThread::PreTranslateMessage(MSG* pMsg)
 {
     if (pMsg->hwnd == NULL)

@@ -72,7 +72,7 @@ CWnd* PASCAL CWnd::FromHandlePermanent(HWND hWnd)
 void PASCAL CWnd::DeleteTempMap()
 {
     if (CHandleMap* pMap = afxMapHWND())
-        pMap->DeleteTemp(0);
+        pMap->DeleteTemp();
 }
 
 BOOL CWnd::Attach(HWND hWndNew)
@@ -233,8 +233,9 @@ LRESULT CALLBACK _AfxCbtFilterHook(int code, WPARAM wParam, LPARAM lParam)
             && lstrcmpi(szClassName, _T("IME")) == 0;
         if (!bIme)
         {
+            // m_pWndInit stays set until the window is subclassed: PreSubclassWindow
+            // tells creation (still set) from subclassing an existing window (NULL).
             CWnd* pWndInit = pThreadState->m_pWndInit;
-            pThreadState->m_pWndInit = NULL;
             if (pWndInit->Attach(hWnd))
             {
                 pWndInit->PreSubclassWindow();
@@ -244,6 +245,7 @@ LRESULT CALLBACK _AfxCbtFilterHook(int code, WPARAM wParam, LPARAM lParam)
                 if (oldWndProc != &AfxWndProc)
                     *pOldWndProc = oldWndProc;
             }
+            pThreadState->m_pWndInit = NULL;
         }
     }
     return ::CallNextHookEx(pThreadState->m_hHookOldCbtFilter, code, wParam, lParam);
@@ -587,8 +589,9 @@ static BOOL DispatchWndMsg(CWnd* pThis, const AFX_MSGMAP_ENTRY* lpEntry, UINT_PT
     case AfxSig_vt:
         (pThis->*AfxWndHandler<void (CWnd::*)(UINT_PTR)>(pfn))((UINT_PTR)wParam);
         break;
-    case AfxSig_vww:
-        (pThis->*AfxWndHandler<void (CWnd::*)(UINT, UINT)>(pfn))((UINT)wParam, (UINT)lParam);
+    case AfxSig_vwwx:
+        // reflected scrolling: the code and the position, without the scroll bar
+        (pThis->*AfxWndHandler<void (CWnd::*)(UINT, UINT)>(pfn))(LOWORD(wParam), HIWORD(wParam));
         break;
     case AfxSig_vbw:
         (pThis->*AfxWndHandler<void (CWnd::*)(BOOL, UINT)>(pfn))((BOOL)wParam, (UINT)lParam);
@@ -642,9 +645,6 @@ static BOOL DispatchWndMsg(CWnd* pThis, const AFX_MSGMAP_ENTRY* lpEntry, UINT_PT
         (pThis->*AfxWndHandler<void (CWnd::*)(int, void*)>(pfn))((int)wParam, (void*)lParam);
         lResult = TRUE;
         break;
-    case AfxSig_bOWNER:
-        lResult = (pThis->*AfxWndHandler<BOOL (CWnd::*)(int, void*)>(pfn))((int)wParam, (void*)lParam);
-        break;
     case AfxSig_wv:
         lResult = (pThis->*AfxWndHandler<UINT (CWnd::*)()>(pfn))();
         break;
@@ -657,10 +657,6 @@ static BOOL DispatchWndMsg(CWnd* pThis, const AFX_MSGMAP_ENTRY* lpEntry, UINT_PT
         break;
     case AfxSig_bHELPINFO:
         lResult = (pThis->*AfxWndHandler<BOOL (CWnd::*)(HELPINFO*)>(pfn))((HELPINFO*)lParam);
-        break;
-    case AfxSig_vWww:
-        (pThis->*AfxWndHandler<void (CWnd::*)(CWnd*, UINT, UINT)>(pfn))(
-            CWnd::FromHandle((HWND)wParam), LOWORD(lParam), HIWORD(lParam));
         break;
     default:
         return FALSE;
@@ -1016,8 +1012,9 @@ BOOL CWnd::PreTranslateMessage(MSG*)
     return FALSE;
 }
 
-// Offers the message to each framework object from its window up to hWndStop,
-// stopping at the top-level window.
+// Offers the message to each framework object from its window up to hWndStop.
+// ::GetParent leads from a pop-up to its owner, so a dialog's controls, the dialog
+// and the window that owns it all get their look.
 BOOL PASCAL CWnd::WalkPreTranslateTree(HWND hWndStop, MSG* pMsg)
 {
     for (HWND hWnd = pMsg->hwnd; hWnd != NULL; hWnd = ::GetParent(hWnd))
@@ -1025,7 +1022,7 @@ BOOL PASCAL CWnd::WalkPreTranslateTree(HWND hWndStop, MSG* pMsg)
         CWnd* pWnd = CWnd::FromHandlePermanent(hWnd);
         if (pWnd != NULL && pWnd->PreTranslateMessage(pMsg))
             return TRUE;
-        if (hWnd == hWndStop || !(::GetWindowLongPtr(hWnd, GWL_STYLE) & WS_CHILD))
+        if (hWnd == hWndStop)
             break;
     }
     return FALSE;
@@ -1069,9 +1066,11 @@ void CWnd::EndModalState()
 {
 }
 
-// Runs until EndModalLoop. The thread's PreTranslateMessage sees every message,
-// so the controls' own pre-translation works inside the loop. When the queue
-// goes idle, temporary objects made inside this loop are freed.
+// Runs until EndModalLoop, or until the window is gone. The thread's
+// PreTranslateMessage sees every message, so the controls' own pre-translation
+// works inside the loop. As in MFC, temporary objects are not freed here but at
+// the thread's next idle time: a handler of the modal window may keep a pointer
+// from FromHandle for as long as the message it handles.
 int CWnd::RunModalLoop(DWORD dwFlags)
 {
     BOOL bIdle = TRUE;
@@ -1081,16 +1080,7 @@ int CWnd::RunModalLoop(DWORD dwFlags)
     HWND hWndThis = m_hWnd;
     m_nFlags |= (WF_MODALLOOP | WF_CONTINUEMODAL);
 
-    _AFX_THREAD_STATE* pThreadState = AfxGetThreadState();
-    MSG* pMsg = &pThreadState->m_msgCur;
-    unsigned nTempGeneration = afxMapHWND(TRUE)->CurrentGeneration();
-    if (pThreadState->m_nModalTempFloor != 0 && pThreadState->m_pModalTempFloorWnd == this)
-    {
-        nTempGeneration = pThreadState->m_nModalTempFloor - 1;
-        pThreadState->m_nModalTempFloor = 0;
-    }
-    ++pThreadState->m_nModalDepth;
-
+    MSG* pMsg = &AfxGetThreadState()->m_msgCur;
     CWinThread* pThread = AfxGetThread();
     int nResult = -1;
     for (;;)
@@ -1106,8 +1096,6 @@ int CWnd::RunModalLoop(DWORD dwFlags)
             }
             if (!(dwFlags & MLF_NOIDLEMSG) && hWndParent != NULL && lIdleCount == 0)
                 ::SendMessage(hWndParent, WM_ENTERIDLE, MSGF_DIALOGBOX, (LPARAM)hWndThis);
-            if (lIdleCount == 0 && AfxGetModuleThreadState()->m_nTempMapLock == 0)
-                AfxDeleteTempObjects(nTempGeneration);
             if ((dwFlags & MLF_NOKICKIDLE) || !::SendMessage(hWndThis, WM_KICKIDLE, MSGF_DIALOGBOX, lIdleCount++))
                 bIdle = FALSE;
         }
@@ -1139,6 +1127,7 @@ int CWnd::RunModalLoop(DWORD dwFlags)
                 bShowIdle = FALSE;
             }
 
+            // A window destroyed from outside (with its owner, say) ends the loop too.
             if (!::IsWindow(hWndThis) || !ContinueModal())
             {
                 nResult = m_nModalResult;
@@ -1154,7 +1143,6 @@ int CWnd::RunModalLoop(DWORD dwFlags)
     }
 
 ExitModal:
-    --pThreadState->m_nModalDepth;
     m_nFlags &= ~(WF_MODALLOOP | WF_CONTINUEMODAL);
     return nResult;
 }

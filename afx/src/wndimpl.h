@@ -12,13 +12,12 @@
 /////////////////////////////////////////////////////////////////////////////
 // CHandleMap: HWND -> CWnd* for one thread. Permanent entries are objects the
 // program attached; temporary entries are objects made by FromHandle, owned by
-// the map and freed at idle time. Each temporary carries the generation in
-// which it was made, so a modal loop frees only what was made inside it.
+// the map and freed at the thread's idle time.
 
 class CHandleMap
 {
 public:
-    CHandleMap() : m_nGeneration(0) {}
+    CHandleMap() {}
     ~CHandleMap();
 
     CWnd* FromHandle(HWND hWnd);
@@ -26,28 +25,18 @@ public:
     CWnd* LookupTemporary(HWND hWnd) const;
     void SetPermanent(HWND hWnd, CWnd* pWnd);
     void RemoveHandle(HWND hWnd);
-
-    // Frees temporaries made after generation nAfter (0: all of them).
-    void DeleteTemp(unsigned nAfter = 0);
-    unsigned CurrentGeneration() const { return m_nGeneration; }
-    size_t TemporaryCount() const { return m_temporaryMap.size(); }
+    void DeleteTemp();
 
 private:
-    struct TempEntry
-    {
-        CWnd* pWnd;
-        unsigned nGeneration;
-    };
     std::unordered_map<HWND, CWnd*> m_permanentMap;
-    std::unordered_map<HWND, TempEntry> m_temporaryMap;
-    unsigned m_nGeneration;
+    std::unordered_map<HWND, CWnd*> m_temporaryMap;
 };
 
 CHandleMap* AFXAPI afxMapHWND(BOOL bCreate = FALSE);
 
 // Frees the temporary objects of every kind the framework keeps (windows, image
-// lists, GDI objects); nAfter as in CHandleMap::DeleteTemp.
-void AFXAPI AfxDeleteTempObjects(unsigned nAfter);
+// lists, GDI objects).
+void AFXAPI AfxDeleteTempObjects();
 
 LRESULT CALLBACK _AfxCbtFilterHook(int code, WPARAM wParam, LPARAM lParam);
 
@@ -55,7 +44,7 @@ LRESULT CALLBACK _AfxCbtFilterHook(int code, WPARAM wParam, LPARAM lParam);
 void AFXAPI AfxTermThreadState();
 void AFXAPI AfxTermModuleState();
 
-// GDI wrappers come from afxgdi_.h once it exists.
+// The CDC wrapper for a DC handed in with a message (temporary unless owned).
 CDC* AFXAPI AfxDCFromHandle(HDC hDC);
 
 // Message handlers are stored as one generic member pointer; these undo the

@@ -4,6 +4,12 @@
 // a second click reverses the order, and the header shows the sort with its indicator.
 // Dragging a header moves its column; the page keeps the column types and the sort
 // with the column. The line below the list shows what GetSortInfo reports.
+// The list draws itself: the switch above it picks the highlight (label, all columns,
+// whole row); rows marked invalid (state bit 0x0010) show in red; the page shortens long
+// folder paths through the abbreviate callback; the check boxes are state images that
+// a click on them toggles; a cut-off cell shows its whole text in a title tip. In
+// screenshot mode the pointer rests on a shortened folder so that the picture has its
+// tip, and one more picture is taken per highlight type.
 #include "GalleryPage.h"
 
 #include <afxcmn.h>
@@ -24,18 +30,30 @@ struct ColumnSpec
     unsigned char type;
 };
 
+// The columns leave room on the right, where only the whole-row highlight reaches.
 const ColumnSpec kColumns[] = {
-    { _T("Name"), LVCFMT_LEFT, 170, 1 },
-    { _T("Size"), LVCFMT_RIGHT, 80, 2 },
-    { _T("Modified"), LVCFMT_LEFT, 90, 3 },
-    { _T("Time"), LVCFMT_LEFT, 80, 6 },
-    { _T("Type"), LVCFMT_LEFT, 120, 0 },
-    { _T("Comment"), LVCFMT_LEFT, 130, 4 },
-    { _T("Flag"), LVCFMT_LEFT, 50, 7 },
+    { _T("Name"), LVCFMT_LEFT, 160, 1 },
+    { _T("Size"), LVCFMT_RIGHT, 70, 2 },
+    { _T("Modified"), LVCFMT_LEFT, 80, 3 },
+    { _T("Time"), LVCFMT_LEFT, 70, 6 },
+    { _T("Type"), LVCFMT_LEFT, 100, 0 },
+    { _T("Folder"), LVCFMT_LEFT, 150, 1 },
+    { _T("Comment"), LVCFMT_LEFT, 90, 4 },
+    { _T("Flag"), LVCFMT_LEFT, 40, 7 },
 };
 const int kColumnCount = sizeof kColumns / sizeof kColumns[0];
 const int kRows = 5000;
-const int kFlagColumn = 6;
+const int kFolderColumn = 5;
+const int kFlagColumn = 7;
+// Every this many rows one is marked invalid.
+const int kInvalidEvery = 13;
+// In screenshot mode the pointer rests on the first long folder from this row in view on.
+const int kScreenshotRow = 4;
+
+bool InScreenshotMode()
+{
+    return wcsstr(::GetCommandLineW(), L"/screenshots") != nullptr;
+}
 const COLORREF kFlagColors[] = { RGB(200, 40, 40), RGB(240, 160, 20), RGB(40, 160, 60), RGB(50, 90, 200) };
 const int kFlagCount = sizeof kFlagColors / sizeof kFlagColors[0];
 
@@ -58,8 +76,19 @@ public:
         m_pOwnerPage = pOwnerPage;
         m_types = types;
         SetColumnTypes(m_types.data(), static_cast<unsigned int>(m_types.size()));
-        m_ctlHeader.EnableDrag(true);
+        EnableHeaderDrag(true);
         m_ctlHeader.SetCallback(this, static_cast<void (CWnd::*)(int, int)>(&CFileList::OnColumnDragged));
+    }
+
+    // The title tip hides itself when the pointer leaves the cell; a page that is hidden
+    // while the pointer rests takes it away.
+    void HideTitleTip()
+    {
+        if (m_ctlTitleTip.GetSafeHwnd() != NULL && m_ctlTitleTip.IsWindowVisible())
+        {
+            ::ReleaseCapture();
+            m_ctlTitleTip.ShowWindow(SW_HIDE);
+        }
     }
 
     void PostSort() override
@@ -135,27 +164,45 @@ class CListPage : public CGalleryPage
 public:
     LPCTSTR GetTitle() const override { return _T("List"); }
     void CreateControls() override;
+    int GetScreenshotVariantCount() const override { return kHighlightTypes; }
+    CString ShowScreenshotVariant(int nVariant) override;
 
 protected:
     afx_msg LRESULT OnSorted(WPARAM wParam, LPARAM lParam);
+    afx_msg void OnHighlightType(UINT nID);
+    afx_msg void OnWindowPosChanged(WINDOWPOS* lpwndpos);
+    afx_msg LRESULT OnRestOnFolder(WPARAM wParam, LPARAM lParam);
     DECLARE_MESSAGE_MAP()
 
 private:
-    enum { IDC_LIST = 500, IDC_SORTINFO };
+    enum { IDC_LIST = 500, IDC_SORTINFO, IDC_HIGHLIGHT_LABEL, IDC_HIGHLIGHT_FIRST };
+    static const int kHighlightTypes = 3;
+    static const UINT kRestOnFolderMessage = WM_APP + 21;
 
+    // The list's abbreviate callback: a text longer than nMaxLength that is a path keeps
+    // its first nKeepFirst parts and as many of its last parts as fit, "..." between.
+    CString AbbreviatePath(CString strText, int nMaxLength, int nKeepFirst);
     void CreateFlagImages();
+    void CreateCheckImages();
     void Fill();
 
     CWnd m_label;
+    CWnd m_highlightLabel;
+    CButton m_highlight[kHighlightTypes];
     CFileList m_list;
     CWnd m_sortInfo;
     CImageList m_flags;
+    CImageList m_checks;
 };
 
 GALLERY_PAGE(20, CListPage);
 
 BEGIN_MESSAGE_MAP(CListPage, CGalleryPage)
     ON_MESSAGE(CFileList::kSortedMessage, &CListPage::OnSorted)
+    ON_CONTROL_RANGE(BN_CLICKED, IDC_HIGHLIGHT_FIRST, IDC_HIGHLIGHT_FIRST + kHighlightTypes - 1,
+                     &CListPage::OnHighlightType)
+    ON_WM_WINDOWPOSCHANGED()
+    ON_MESSAGE(kRestOnFolderMessage, &CListPage::OnRestOnFolder)
 END_MESSAGE_MAP()
 
 void CListPage::CreateControls()
@@ -164,16 +211,36 @@ void CListPage::CreateControls()
     GetClientRect(&rc);
     m_label.Create(_T("STATIC"),
         _T("Click a header to sort by its column, again to reverse; drag a header to move its column. ")
-        _T("Times count from 6:00 AM; comments do not sort."),
-        WS_CHILD | WS_VISIBLE, CRect(12, 10, rc.right - 12, 28), this, 0xFFFF);
+        _T("Times count from 6:00 AM; comments do not sort. Rows in red are marked invalid; long ")
+        _T("folders are shortened, and resting the pointer on a cut-off cell shows its whole text."),
+        WS_CHILD | WS_VISIBLE, CRect(12, 8, rc.right - 12, 38), this, 0xFFFF);
     m_label.SetFont(GuiFont());
 
-    m_list.CreateEx(WS_EX_CLIENTEDGE, WS_CHILD | WS_VISIBLE | WS_TABSTOP | LVS_REPORT | LVS_SHOWSELALWAYS,
-        CRect(12, 32, rc.right - 12, rc.bottom - 34), this, IDC_LIST);
+    m_highlightLabel.Create(_T("STATIC"), _T("Highlight:"), WS_CHILD | WS_VISIBLE, CRect(12, 44, 70, 60), this,
+                            IDC_HIGHLIGHT_LABEL);
+    m_highlightLabel.SetFont(GuiFont());
+    const LPCTSTR kHighlightNames[kHighlightTypes] = { _T("Label"), _T("All columns"), _T("Whole row") };
+    for (int i = 0; i < kHighlightTypes; ++i)
+    {
+        m_highlight[i].Create(kHighlightNames[i], WS_CHILD | WS_VISIBLE | BS_AUTORADIOBUTTON | (i == 0 ? WS_GROUP : 0),
+                              CRect(76 + 100 * i, 42, 170 + 100 * i, 62), this, IDC_HIGHLIGHT_FIRST + i);
+        m_highlight[i].SetFont(GuiFont());
+    }
+
+    // Owner-drawn from the start, so that the label highlight draws as the others do.
+    m_list.CreateEx(WS_EX_CLIENTEDGE,
+        WS_CHILD | WS_VISIBLE | WS_TABSTOP | LVS_REPORT | LVS_SHOWSELALWAYS | LVS_OWNERDRAWFIXED,
+        CRect(12, 68, rc.right - 12, rc.bottom - 34), this, IDC_LIST);
     m_list.SetFont(GuiFont());
     m_list.SetExtendedStyle(LVS_EX_FULLROWSELECT | LVS_EX_SUBITEMIMAGES);
     CreateFlagImages();
+    CreateCheckImages();
     m_list.SetImageList(&m_flags, LVSIL_SMALL);
+    m_list.SetImageList(&m_checks, LVSIL_STATE);
+    m_list.SetAbbreviateName(static_cast<CString (CWnd::*)(CString, int, int)>(&CListPage::AbbreviatePath));
+    m_list.EnableTitleTip(true);
+    m_highlight[1].SetCheck(BST_CHECKED);
+    m_list.SetHighlightType(1);
 
     m_sortInfo.Create(_T("STATIC"), _T(""), WS_CHILD | WS_VISIBLE, CRect(12, rc.bottom - 26, rc.right - 12, rc.bottom - 8),
         this, IDC_SORTINFO);
@@ -182,7 +249,7 @@ void CListPage::CreateControls()
     std::vector<unsigned char> types;
     for (int c = 0; c < kColumnCount; ++c)
     {
-        m_list.InsertColumn(c, kColumns[c].title, kColumns[c].format, kColumns[c].width);
+        m_list.InsertColumn(c, kColumns[c].title, kColumns[c].format, kColumns[c].width, c);
         types.push_back(kColumns[c].type);
     }
     m_list.Setup(this, types);
@@ -218,6 +285,55 @@ void CListPage::CreateFlagImages()
     }
 }
 
+void CListPage::CreateCheckImages()
+{
+    // State image 1 a clear box, 2 a checked one, as the system draws check buttons.
+    m_checks.Create(16, 16, ILC_COLOR24 | ILC_MASK, 2, 0);
+    CClientDC screen(this);
+    for (int i = 0; i < 2; ++i)
+    {
+        CDC dc;
+        dc.CreateCompatibleDC(&screen);
+        CBitmap bitmap;
+        bitmap.CreateCompatibleBitmap(&screen, 16, 16);
+        CBitmap* pOldBitmap = dc.SelectObject(&bitmap);
+        dc.FillSolidRect(0, 0, 16, 16, ::GetSysColor(COLOR_WINDOW));
+        CRect box(2, 2, 15, 15);
+        dc.DrawFrameControl(&box, DFC_BUTTON, DFCS_BUTTONCHECK | DFCS_FLAT | (i == 1 ? DFCS_CHECKED : 0));
+        dc.SelectObject(pOldBitmap);
+        m_checks.Add(&bitmap, RGB(255, 0, 255));
+    }
+}
+
+CString CListPage::AbbreviatePath(CString strText, int nMaxLength, int nKeepFirst)
+{
+    if (strText.GetLength() <= nMaxLength || strText.Find(_T('\\')) < 0)
+        return strText;
+    CStringArray parts;
+    for (int nStart = 0;;)
+    {
+        const int nEnd = strText.Find(_T('\\'), nStart);
+        parts.Add(strText.Mid(nStart, nEnd < 0 ? strText.GetLength() - nStart : nEnd - nStart));
+        if (nEnd < 0)
+            break;
+        nStart = nEnd + 1;
+    }
+    CString strHead;
+    for (int i = 0; i < nKeepFirst && i < parts.GetSize(); ++i)
+        strHead += parts[i] + _T("\\");
+    strHead += _T("...");
+    // The last part always stays, even when it alone is longer than the limit.
+    CString strTail = _T("\\") + parts[parts.GetSize() - 1];
+    for (INT_PTR i = parts.GetSize() - 2; i >= nKeepFirst; --i)
+    {
+        const CString strLonger = _T("\\") + parts[i] + strTail;
+        if (strHead.GetLength() + strLonger.GetLength() > nMaxLength)
+            break;
+        strTail = strLonger;
+    }
+    return strHead + strTail;
+}
+
 void CListPage::Fill()
 {
     static const LPCTSTR kWords[] = { _T("Report"), _T("invoice"), _T("Budget"), _T("holiday"), _T("Letter"),
@@ -226,7 +342,9 @@ void CListPage::Fill()
     static const FileType kTypes[] = { { _T("pdf"), _T("PDF document") }, { _T("txt"), _T("Text file") },
         { _T("png"), _T("PNG image") }, { _T("csv"), _T("CSV spreadsheet") }, { _T("docx"), _T("Word document") } };
     static const LPCTSTR kComments[] = { _T(""), _T("checked"), _T("to review"), _T(""), _T("sent to Ben"),
-        _T("draft"), _T("") };
+        _T("draft"), _T("waiting for the signed copy"), _T("") };
+    static const LPCTSTR kFolders[] = { _T("Documents"), _T("Projects"), _T("Archive 2023"), _T("Customers"),
+        _T("Shared with the accounting team"), _T("Scans"), _T("Quarterly reports"), _T("Drafts") };
 
     // Filled with redraw off: a visible list repaints after every insertion.
     m_list.SetRedraw(FALSE);
@@ -244,10 +362,16 @@ void CListPage::Fill()
         m_list.SetItemText(r, 2, COleDateTime(44197.0 + next() % 1095).Format(VAR_DATEVALUEONLY));
         m_list.SetItemText(r, 3, COleDateTime((next() % 1440) / 1440.0).Format(VAR_TIMEVALUEONLY));
         m_list.SetItemText(r, 4, type.name);
-        m_list.SetItemText(r, 5, kComments[next() % 7]);
+        text = _T("C:\\Users\\Public");
+        for (unsigned nDepth = 1 + next() % 4; nDepth > 0; --nDepth)
+            text += CString(_T("\\")) + kFolders[next() % 8];
+        m_list.SetItemText(r, kFolderColumn, text);
+        m_list.SetItemText(r, 6, kComments[next() % 8]);
         const int nFlag = static_cast<int>(next() % kFlagCount);
         m_list.SetItem(r, kFlagColumn, LVIF_IMAGE, NULL, nFlag, 0, 0, 0);
         m_list.SetFlag(r, nFlag);
+        const UINT nState = INDEXTOSTATEIMAGEMASK(next() % 3 == 0 ? 2 : 1) | (r % kInvalidEvery == 5 ? LVIS_GLOW : 0);
+        m_list.SetItemState(r, nState, LVIS_STATEIMAGEMASK | LVIS_GLOW);
     }
     m_list.SetRedraw(TRUE);
     m_list.Invalidate();
@@ -276,5 +400,46 @@ LRESULT CListPage::OnSorted(WPARAM, LPARAM)
         text.Format(_T("GetSortInfo: not sorted.   %d rows."), m_list.GetItemCount());
     }
     m_sortInfo.SetWindowText(text);
+    return 0;
+}
+
+void CListPage::OnHighlightType(UINT nID)
+{
+    m_list.SetHighlightType(static_cast<int>(nID - IDC_HIGHLIGHT_FIRST));
+}
+
+CString CListPage::ShowScreenshotVariant(int nVariant)
+{
+    for (int i = 0; i < kHighlightTypes; ++i)
+        m_highlight[i].SetCheck(i == nVariant ? BST_CHECKED : BST_UNCHECKED);
+    m_list.SetHighlightType(nVariant);
+    CString strSuffix;
+    strSuffix.Format(_T("type%d"), nVariant);
+    return strSuffix;
+}
+
+void CListPage::OnWindowPosChanged(WINDOWPOS* lpwndpos)
+{
+    // The gallery shows its pages with SetWindowPos, which sends no WM_SHOWWINDOW.
+    CGalleryPage::OnWindowPosChanged(lpwndpos);
+    if (lpwndpos->flags & SWP_HIDEWINDOW)
+        m_list.HideTitleTip();
+    else if ((lpwndpos->flags & SWP_SHOWWINDOW) && InScreenshotMode())
+        PostMessage(kRestOnFolderMessage);
+}
+
+LRESULT CListPage::OnRestOnFolder(WPARAM, LPARAM)
+{
+    // As if the user selected a row and rested the pointer on a shortened folder: the
+    // system sends the list the move, and the tip shows the whole path.
+    m_list.SetFocus();
+    int nItem = m_list.GetTopIndex() + kScreenshotRow;
+    while (nItem + 1 < m_list.GetItemCount() && m_list.GetItemText(nItem, kFolderColumn).GetLength() <= 40)
+        ++nItem;
+    m_list.SetItemState(nItem, LVIS_SELECTED | LVIS_FOCUSED, LVIS_SELECTED | LVIS_FOCUSED);
+    CRect rc;
+    m_list.GetSubItemRect(nItem, kFolderColumn, LVIR_BOUNDS, rc);
+    m_list.ClientToScreen(&rc);
+    ::SetCursorPos(rc.left + 30, rc.CenterPoint().y);
     return 0;
 }

@@ -23,10 +23,26 @@ BOOL HoldsCapture(const CWnd* pWnd)
     return hWnd != NULL && ::IsWindow(hWnd) && ::GetCapture() == hWnd;
 }
 
-void ReleaseOwnCapture(const CWnd* pWnd)
+void Press(CWnd* pButton)
 {
-    if (HoldsCapture(pWnd))
-        ::ReleaseCapture();
+    pButton->SetCapture();
+    pButton->Invalidate(FALSE);
+    NotifyOwner(pButton);
+}
+
+BOOL ReleaseOwnCapture(const CWnd* pWnd)
+{
+    if (!HoldsCapture(pWnd))
+        return FALSE;
+    ::ReleaseCapture();
+    return TRUE;
+}
+
+BOOL ReleaseWhenLeft(CWnd* pButton, CPoint point)
+{
+    CRect rcClient;
+    pButton->GetClientRect(&rcClient);
+    return !rcClient.PtInRect(point) && ReleaseOwnCapture(pButton);
 }
 
 void Paint(CWnd* pButton, ButtonLook::Kind kind, BOOL bPressed, UINT nBitmapNormal,

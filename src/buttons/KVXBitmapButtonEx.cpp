@@ -3,7 +3,7 @@
 #include "BitmapButtonSupport.h"
 
 BEGIN_MESSAGE_MAP(KVXBitmapButtonEx, CStatic)
-    ON_CONTROL_REFLECT(STN_CLICKED, OnClicked)
+    ON_CONTROL_REFLECT(STN_CLICKED, &KVXBitmapButtonEx::OnClicked)
     ON_WM_LBUTTONDBLCLK()
     ON_WM_LBUTTONUP()
     ON_WM_MOUSEMOVE()
@@ -33,9 +33,7 @@ void KVXBitmapButtonEx::SetBitmaps(UINT nBitmapNormal, UINT nBitmapPressed, UINT
 // The static control reports STN_CLICKED on the button-down: that is the press.
 void KVXBitmapButtonEx::OnClicked()
 {
-    SetCapture();
-    Invalidate(FALSE);
-    BitmapButtonSupport::NotifyOwner(this);
+    BitmapButtonSupport::Press(this);
 }
 
 // The second press of a double click counts as a press of its own.
@@ -52,10 +50,7 @@ void KVXBitmapButtonEx::OnLButtonUp(UINT nFlags, CPoint point)
 
 void KVXBitmapButtonEx::OnMouseMove(UINT nFlags, CPoint point)
 {
-    CRect rcClient;
-    GetClientRect(&rcClient);
-    if (!rcClient.PtInRect(point))
-        BitmapButtonSupport::ReleaseOwnCapture(this);
+    BitmapButtonSupport::ReleaseWhenLeft(this, point);
     CStatic::OnMouseMove(nFlags, point);
 }
 

@@ -5,7 +5,7 @@
 // A double click is left to the static control, which reports STN_DBLCLK: ignored, so
 // the second press neither toggles nor notifies.
 BEGIN_MESSAGE_MAP(KVXCheckButtonEx, CStatic)
-    ON_CONTROL_REFLECT(STN_CLICKED, OnClicked)
+    ON_CONTROL_REFLECT(STN_CLICKED, &KVXCheckButtonEx::OnClicked)
     ON_WM_LBUTTONUP()
     ON_WM_MOUSEMOVE()
     ON_WM_KILLFOCUS()
@@ -47,9 +47,7 @@ void KVXCheckButtonEx::SetBitmaps(UINT nBitmapNormal, UINT nBitmapPressed, UINT 
 void KVXCheckButtonEx::OnClicked()
 {
     m_bChecked = !m_bChecked;
-    SetCapture();
-    Invalidate(FALSE);
-    BitmapButtonSupport::NotifyOwner(this);
+    BitmapButtonSupport::Press(this);
 }
 
 void KVXCheckButtonEx::OnLButtonUp(UINT nFlags, CPoint point)
@@ -60,10 +58,7 @@ void KVXCheckButtonEx::OnLButtonUp(UINT nFlags, CPoint point)
 
 void KVXCheckButtonEx::OnMouseMove(UINT nFlags, CPoint point)
 {
-    CRect rcClient;
-    GetClientRect(&rcClient);
-    if (!rcClient.PtInRect(point))
-        BitmapButtonSupport::ReleaseOwnCapture(this);
+    BitmapButtonSupport::ReleaseWhenLeft(this, point);
     CStatic::OnMouseMove(nFlags, point);
 }
 

@@ -10,7 +10,8 @@ BEGIN_MESSAGE_MAP(KVXColorPopup, CDialog)
     ON_WM_MOUSEMOVE()
     ON_WM_LBUTTONDOWN()
     ON_WM_LBUTTONUP()
-    ON_BN_CLICKED(IDC_COLOR_OTHER, OnOther)
+    ON_BN_CLICKED(IDC_COLOR_OTHER, &KVXColorPopup::OnOther)
+    ON_WM_CANCELMODE()
 END_MESSAGE_MAP()
 
 KVXColorPopup::KVXColorPopup()
@@ -213,7 +214,7 @@ void KVXColorPopup::PickColor(int nIndex)
 
 void KVXColorPopup::EndPopup(int nResult)
 {
-    if (::GetCapture() == m_hWnd)
+    if (m_hWnd != NULL && ::GetCapture() == m_hWnd)
         ::ReleaseCapture();
     EndDialog(nResult);
 }
@@ -261,6 +262,19 @@ void KVXColorPopup::OnMouseMove(UINT nFlags, CPoint point)
             MoveFocusTo(rcOther.PtInRect(point) ? pOther : pDummy);
         }
     }
+}
+
+// The popup sees clicks outside only through its capture. A cancel mode that takes it
+// while the popup is still the active window is answered by taking it back: this
+// platform sends one late, when the focus comes back from the colour dialog, and the
+// popup would then stay open, deaf to clicks outside. (Opening the colour dialog
+// releases the capture first, so its cancel mode finds none to take back.)
+void KVXColorPopup::OnCancelMode()
+{
+    const bool bHeld = ::GetCapture() == m_hWnd;
+    CDialog::OnCancelMode();
+    if (bHeld && ::GetCapture() == NULL && ::GetActiveWindow() == m_hWnd && IsWindowEnabled())
+        SetCapture();
 }
 
 void KVXColorPopup::OnLButtonDown(UINT nFlags, CPoint point)
@@ -335,7 +349,11 @@ void KVXColorPopup::OnOther()
         dlg.SetWindowName(m_pColorWell->GetColorName());
     dlg.m_cc.rgbResult = m_clrColor;
     dlg.m_cc.Flags |= CC_RGBINIT | CC_FULLOPEN;
-    if (dlg.DoModal() == IDOK)
+    const HWND hWnd = m_hWnd;
+    const INT_PTR nResult = dlg.DoModal();
+    if (!::IsWindow(hWnd))
+        return;     // the popup went, with its well, while the dialog was up
+    if (nResult == IDOK)
     {
         m_clrColor = dlg.GetColor();
         if (m_pColorWell != NULL)

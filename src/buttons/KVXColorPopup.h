@@ -66,5 +66,6 @@ protected:
     afx_msg void OnLButtonDown(UINT nFlags, CPoint point);
     afx_msg void OnLButtonUp(UINT nFlags, CPoint point);
     afx_msg void OnOther();
+    afx_msg void OnCancelMode();
     DECLARE_MESSAGE_MAP()
 };

@@ -4,7 +4,7 @@
 #include "resource.h"
 
 BEGIN_MESSAGE_MAP(KVXColorWell, CButton)
-    ON_CONTROL_REFLECT(BN_CLICKED, OnClicked)
+    ON_CONTROL_REFLECT(BN_CLICKED, &KVXColorWell::OnClicked)
 END_MESSAGE_MAP()
 
 KVXColorWell::KVXColorWell()
@@ -153,6 +153,18 @@ void KVXColorWell::OnClicked()
     DoColorWellDlg();
 }
 
+// The well's window is gone (with its dialog, say) while its popup may be up: the popup
+// and the colour dialog it owns go too, so that DoColorWellDlg returns at once and
+// sends nothing. Ending the modal loop first also ends it where the popup's window
+// went before the well's (owned by the same top-level window).
+void KVXColorWell::PostNcDestroy()
+{
+    m_popup.EndPopup(IDCANCEL);
+    if (::IsWindow(m_popup.GetSafeHwnd()))
+        m_popup.DestroyWindow();
+    CButton::PostNcDestroy();
+}
+
 void KVXColorWell::DoColorWellDlg()
 {
     if (m_popup.DoModal() != IDOK)
@@ -175,116 +187,147 @@ void KVXColorWell::DoColorWellDlg()
     ::SendMessage(hParent, WM_KVX_COLORWELLCHANGED, nID, reinterpret_cast<LPARAM>(&notify));
 }
 
+// The well's parts, measured from the item rectangle: a frame two pixels wide; at the
+// right a strip with a separator (two lines 10 and 11 pixels from the right edge) and a
+// small arrow; the swatch fills the rest inside the frame, 15 pixels short of the right
+// edge. Separator and swatch keep 4 pixels from the top and bottom edges.
+namespace {
+
+constexpr int kSeparatorFromRight = 10;     // the highlight line; its shadow line is left of it
+constexpr int kInsetVertical = 4;
+constexpr int kSwatchFromLeft = 5;
+constexpr int kSwatchFromRight = 15;
+constexpr int kArrowCentreFromRight = 6;    // rows of 5, 3 and 1 pixels centred there
+constexpr int kFocusInset = 3;
+
+struct WellPens
+{
+    CPen black{ PS_SOLID, 1, RGB(0, 0, 0) };
+    CPen shadow{ PS_SOLID, 1, ::GetSysColor(COLOR_BTNSHADOW) };
+    CPen highlight{ PS_SOLID, 1, ::GetSysColor(COLOR_BTNHIGHLIGHT) };
+};
+
+// Lines end before their end point, as LineTo does.
+void Line(CDC* pDC, CPen& pen, int x0, int y0, int x1, int y1)
+{
+    pDC->SelectObject(&pen);
+    pDC->MoveTo(x0, y0);
+    pDC->LineTo(x1, y1);
+}
+
+// Raised: black outside at the bottom and right, shadow inside it, highlight at the top
+// and left.
+void DrawRaisedFrame(CDC* pDC, const CRect& rc, WellPens& pens)
+{
+    Line(pDC, pens.black, rc.left, rc.bottom - 1, rc.right - 1, rc.bottom - 1);
+    pDC->LineTo(rc.right - 1, rc.top);
+    Line(pDC, pens.shadow, rc.left + 1, rc.bottom - 2, rc.right - 2, rc.bottom - 2);
+    pDC->LineTo(rc.right - 2, rc.top + 1);
+    pDC->SelectObject(&pens.highlight);
+    pDC->LineTo(rc.left + 1, rc.top + 1);
+    pDC->LineTo(rc.left + 1, rc.bottom - 2);
+}
+
+// Sunken: shadow outside at the left and top, highlight at the right and bottom, black
+// inside at the left and top.
+void DrawSunkenFrame(CDC* pDC, const CRect& rc, WellPens& pens)
+{
+    Line(pDC, pens.shadow, rc.left, rc.bottom - 1, rc.left, rc.top);
+    pDC->LineTo(rc.right - 1, rc.top);
+    Line(pDC, pens.highlight, rc.right - 1, rc.top - 1, rc.right - 1, rc.bottom - 1);
+    pDC->LineTo(rc.left + 1, rc.bottom - 1);
+    Line(pDC, pens.black, rc.left + 1, rc.bottom - 2, rc.left + 1, rc.top + 1);
+    pDC->LineTo(rc.right - 2, rc.top + 1);
+}
+
+void DrawSeparator(CDC* pDC, const CRect& rc, WellPens& pens)
+{
+    const int x = rc.right - kSeparatorFromRight;
+    Line(pDC, pens.highlight, x, rc.top + kInsetVertical, x, rc.bottom - kInsetVertical);
+    Line(pDC, pens.shadow, x - 1, rc.top + kInsetVertical, x - 1, rc.bottom - kInsetVertical);
+}
+
+// The drop-down arrow points down from the middle row m = bottom / 2. Disabled, it is
+// drawn in the shadow colour with the right end of each row white (embossed).
+void DrawArrow(CDC* pDC, const CRect& rc, WellPens& pens, bool bEnabled)
+{
+    const int cx = rc.right - kArrowCentreFromRight;
+    const int m = rc.bottom / 2;
+    for (int row = 0; row < 3; ++row)
+    {
+        const int half = 2 - row;
+        const int y = m - 1 + row;
+        Line(pDC, bEnabled ? pens.black : pens.shadow, cx + half, y, cx - half - 1, y);
+        if (!bEnabled)
+            pDC->SetPixel(cx + half, y, RGB(255, 255, 255));
+    }
+}
+
+// The colour, or a black cross hatch while it is undefined, framed in black.
+void DrawSwatch(CDC* pDC, const CRect& rc, WellPens& pens, COLORREF clr, BOOL bUndefined)
+{
+    CBrush brush;
+    if (bUndefined)
+        brush.CreateHatchBrush(HS_DIAGCROSS, RGB(0, 0, 0));
+    else
+        brush.CreateSolidBrush(clr);
+    pDC->SelectObject(&pens.black);
+    CBrush* pOldBrush = pDC->SelectObject(&brush);
+    pDC->Rectangle(rc.left + kSwatchFromLeft, rc.top + kInsetVertical, rc.right - kSwatchFromRight,
+                   rc.bottom - kInsetVertical);
+    pDC->SelectObject(pOldBrush);
+}
+
+// Black dots on every second pixel of a rectangle inset by 3 (one pixel less at the
+// bottom).
+void DrawFocusDots(CDC* pDC, const CRect& rc)
+{
+    const COLORREF clrBlack = RGB(0, 0, 0);
+    const int left = rc.left + kFocusInset;
+    const int top = rc.top + kFocusInset;
+    const int right = rc.right - kFocusInset;
+    const int bottom = rc.bottom - kFocusInset - 1;
+    for (int x = left; x < right; x += 2)
+    {
+        pDC->SetPixel(x, top, clrBlack);
+        pDC->SetPixel(x, bottom, clrBlack);
+    }
+    for (int y = top; y < bottom; y += 2)
+    {
+        pDC->SetPixel(left, y, clrBlack);
+        pDC->SetPixel(right, y, clrBlack);
+    }
+}
+
+} // namespace
+
 void KVXColorWell::DrawItem(LPDRAWITEMSTRUCT lpDrawItemStruct)
 {
     CDC* pDC = CDC::FromHandle(lpDrawItemStruct->hDC);
     const UINT nState = lpDrawItemStruct->itemState;
-    int L = lpDrawItemStruct->rcItem.left;
-    int T = lpDrawItemStruct->rcItem.top;
-    int R = lpDrawItemStruct->rcItem.right;
-    int B = lpDrawItemStruct->rcItem.bottom;
-    const BOOL bEnabled = (nState & ODS_DISABLED) == 0;
-    const COLORREF clrFace = ::GetSysColor(COLOR_BTNFACE);
-    const COLORREF clrShadow = ::GetSysColor(COLOR_BTNSHADOW);
-    const COLORREF clrHighlight = ::GetSysColor(COLOR_BTNHIGHLIGHT);
-    const COLORREF clrBlack = RGB(0, 0, 0);
+    const bool bEnabled = (nState & ODS_DISABLED) == 0;
+    CRect rc(lpDrawItemStruct->rcItem);
 
-    CRect rcFill(L, T, R, B);
+    CRect rcFill(rc);
     rcFill.InflateRect(1, 1);
-    pDC->FillSolidRect(&rcFill, clrFace);
+    pDC->FillSolidRect(&rcFill, ::GetSysColor(COLOR_BTNFACE));
 
-    CPen penBlack(PS_SOLID, 1, clrBlack);
-    CPen penShadow(PS_SOLID, 1, clrShadow);
-    CPen penHighlight(PS_SOLID, 1, clrHighlight);
-    CPen* pOldPen = pDC->SelectObject(&penBlack);
-
-    if ((nState & ODS_SELECTED) == 0)
+    WellPens pens;
+    CPen* pOldPen = pDC->SelectObject(&pens.black);
+    if (nState & ODS_SELECTED)
     {
-        pDC->MoveTo(L, B - 1);
-        pDC->LineTo(R - 1, B - 1);
-        pDC->LineTo(R - 1, T);
-        pDC->SelectObject(&penShadow);
-        pDC->MoveTo(L + 1, B - 2);
-        pDC->LineTo(R - 2, B - 2);
-        pDC->LineTo(R - 2, T + 1);
-        pDC->SelectObject(&penHighlight);
-        pDC->LineTo(L + 1, T + 1);
-        pDC->LineTo(L + 1, B - 2);
+        DrawSunkenFrame(pDC, rc, pens);
+        rc.OffsetRect(1, 1);    // the pressed look draws everything else one pixel right and down
     }
     else
     {
-        pDC->SelectObject(&penShadow);
-        pDC->MoveTo(L, B - 1);
-        pDC->LineTo(L, T);
-        pDC->LineTo(R - 1, T);
-        pDC->SelectObject(&penHighlight);
-        pDC->MoveTo(R - 1, T - 1);
-        pDC->LineTo(R - 1, B - 1);
-        pDC->LineTo(L + 1, B - 1);
-        pDC->SelectObject(&penBlack);
-        pDC->MoveTo(L + 1, B - 2);
-        pDC->LineTo(L + 1, T + 1);
-        pDC->LineTo(R - 2, T + 1);
-        // The pressed look draws everything else one pixel right and down.
-        ++L;
-        ++T;
-        ++R;
-        ++B;
+        DrawRaisedFrame(pDC, rc, pens);
     }
-
-    // Separator between swatch and arrow.
-    pDC->SelectObject(&penHighlight);
-    pDC->MoveTo(R - 10, T + 4);
-    pDC->LineTo(R - 10, B - 4);
-    pDC->SelectObject(&penShadow);
-    pDC->MoveTo(R - 11, T + 4);
-    pDC->LineTo(R - 11, B - 4);
-
-    // Drop-down arrow; the disabled one is embossed with white pixels.
-    const int m = B / 2;
-    pDC->SelectObject(bEnabled ? &penBlack : &penShadow);
-    pDC->MoveTo(R - 4, m - 1);
-    pDC->LineTo(R - 9, m - 1);
-    pDC->MoveTo(R - 5, m);
-    pDC->LineTo(R - 8, m);
+    DrawSeparator(pDC, rc, pens);
+    DrawArrow(pDC, rc, pens, bEnabled);
     if (bEnabled)
-    {
-        pDC->SetPixel(R - 6, m + 1, clrBlack);
-    }
-    else
-    {
-        pDC->SetPixel(R - 4, m - 1, RGB(255, 255, 255));
-        pDC->SetPixel(R - 5, m, RGB(255, 255, 255));
-        pDC->SetPixel(R - 6, m + 1, RGB(255, 255, 255));
-    }
-
-    // Swatch: the colour, or a cross hatch while undefined; none when disabled.
-    if (bEnabled)
-    {
-        CBrush brush;
-        if (m_popup.m_bColorUndefined)
-            brush.CreateHatchBrush(HS_DIAGCROSS, clrBlack);
-        else
-            brush.CreateSolidBrush(m_popup.m_clrColor);
-        pDC->SelectObject(&penBlack);
-        CBrush* pOldBrush = pDC->SelectObject(&brush);
-        pDC->Rectangle(L + 5, T + 4, R - 15, B - 4);
-        pDC->SelectObject(pOldBrush);
-    }
-
+        DrawSwatch(pDC, rc, pens, m_popup.m_clrColor, m_popup.m_bColorUndefined);
     if (nState & ODS_FOCUS)
-    {
-        for (int x = L + 3; x < R - 3; x += 2)
-        {
-            pDC->SetPixel(x, T + 3, clrBlack);
-            pDC->SetPixel(x, B - 4, clrBlack);
-        }
-        for (int y = T + 3; y < B - 4; y += 2)
-        {
-            pDC->SetPixel(L + 3, y, clrBlack);
-            pDC->SetPixel(R - 3, y, clrBlack);
-        }
-    }
-
+        DrawFocusDots(pDC, rc);
     pDC->SelectObject(pOldPen);
 }

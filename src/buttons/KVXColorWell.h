@@ -68,6 +68,7 @@ public:
 // Overridables
 protected:
     virtual void DrawItem(LPDRAWITEMSTRUCT lpDrawItemStruct);
+    virtual void PostNcDestroy();
 
 // Implementation
 protected:

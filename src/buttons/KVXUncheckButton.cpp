@@ -3,7 +3,7 @@
 #include "BitmapButtonSupport.h"
 
 BEGIN_MESSAGE_MAP(KVXUncheckButton, CStatic)
-    ON_CONTROL_REFLECT(STN_CLICKED, OnClicked)
+    ON_CONTROL_REFLECT(STN_CLICKED, &KVXUncheckButton::OnClicked)
     ON_WM_LBUTTONDBLCLK()
     ON_WM_LBUTTONUP()
     ON_WM_MOUSEMOVE()
@@ -39,9 +39,7 @@ void KVXUncheckButton::SetBitmaps(UINT nBitmapNormal, UINT nBitmapPressed, UINT 
 // Capture first, so that the owner sees IsPressed TRUE during the notification.
 void KVXUncheckButton::OnClicked()
 {
-    SetCapture();
-    Invalidate(FALSE);
-    BitmapButtonSupport::NotifyOwner(this);
+    BitmapButtonSupport::Press(this);
 }
 
 // The second click of a double click is swallowed: no press, no static notification.
@@ -58,13 +56,8 @@ void KVXUncheckButton::OnLButtonUp(UINT nFlags, CPoint point)
 
 void KVXUncheckButton::OnMouseMove(UINT nFlags, CPoint point)
 {
-    CRect rcClient;
-    GetClientRect(&rcClient);
-    if (!rcClient.PtInRect(point) && IsPressed())
-    {
-        ::ReleaseCapture();
+    if (BitmapButtonSupport::ReleaseWhenLeft(this, point))
         BitmapButtonSupport::NotifyOwner(this);
-    }
     CStatic::OnMouseMove(nFlags, point);
 }
 
@@ -77,11 +70,8 @@ void KVXUncheckButton::OnKillFocus(CWnd* pNewWnd)
 
 void KVXUncheckButton::OnEnable(BOOL bEnable)
 {
-    if (!bEnable && IsPressed())
-    {
-        ::ReleaseCapture();
+    if (!bEnable && BitmapButtonSupport::ReleaseOwnCapture(this))
         BitmapButtonSupport::NotifyOwner(this);
-    }
     CStatic::OnEnable(bEnable);
     Invalidate(FALSE);
 }
@@ -91,11 +81,8 @@ void KVXUncheckButton::OnEnable(BOOL bEnable)
 // box) ends a hold with a notification. OnEnable then finds the button released.
 void KVXUncheckButton::OnCancelMode()
 {
-    if (IsPressed())
-    {
-        ::ReleaseCapture();
+    if (BitmapButtonSupport::ReleaseOwnCapture(this))
         BitmapButtonSupport::NotifyOwner(this);
-    }
     CStatic::OnCancelMode();
 }
 

@@ -139,18 +139,7 @@ void KVXDoubleEdit::SetRange(KVXVariant varMin, KVXVariant varMax, int bMinInclu
     if (varMax.GetAs(dMax) == KVT_VARIANT_OK)
         varMax = dMax;
     KVXNumericEdit::SetRange(varMin, varMax, bMinInclude, bMaxInclude);
-    if (IsInRange(m_varValue))
-        return;
-    double dCur = 0.0;
-    double dLower = 0.0;
-    double dUpper = 0.0;
-    m_varValue.GetAs(dCur);
-    GetMinimumInRange().GetAs(dLower);
-    GetMaximumInRange().GetAs(dUpper);
-    if (NumberFormat::LowerEndIsNearer(dLower, dUpper, dCur))
-        SetValueAsVariant(KVXVariant(dLower), TRUE);
-    else
-        SetValueAsVariant(KVXVariant(dUpper), TRUE);
+    MoveIntoRange(false);
 }
 
 KVXVariant KVXDoubleEdit::GetMinimum()
@@ -180,14 +169,8 @@ int KVXDoubleEdit::SyntaxCheck(int bShow)
 
 int KVXDoubleEdit::CharCheck(WCHAR c)
 {
-    if ((::GetKeyState(VK_CONTROL) & 0x8000) && c == NumberFormat::kUndoChar)
-    {
-        if (!m_bUndefined)
-            SetValueAsVariant(m_varCommitted, TRUE);
-        else if (::IsWindow(m_hWnd))
-            SetWindowText(_T(""));
+    if (HandleUndoChar(c))
         return FALSE;
-    }
     if (NumberFormat::IsDoubleEditChar(c))
         return TRUE;
     ::MessageBeep(0xFFFFFFFF);
@@ -230,20 +213,7 @@ int KVXDoubleEdit::SyntaxCheck(KVXString strText)
 
 void KVXDoubleEdit::SetMiddleVal(int bDetermineStep)
 {
-    if (GetUndefined())
-    {
-        // Stepping out of an undefined field starts at 0, or at the lowest value allowed.
-        if (IsInRange(KVXVariant(0.0)))
-        {
-            SetValueAsVariant(KVXVariant(0.0), FALSE);
-        }
-        else
-        {
-            double dLower = 0.0;
-            GetMinimumInRange().GetAs(dLower);
-            SetValueAsVariant(KVXVariant(dLower), FALSE);
-        }
-    }
+    StartFromUndefined(KVXVariant(0.0));
     if (!KVXEdit::SyntaxCheck(FALSE))
         return;
     double dMiddle = 0.0;
@@ -296,9 +266,3 @@ int KVXDoubleEdit::StepTo(long lOffset, bool bUpward)
     return FALSE;
 }
 
-void KVXDoubleEdit::ReleaseSpin()
-{
-    HWND hSpin = GetSpinHwnd();
-    if (m_bSpinButton && hSpin != NULL)
-        ::PostMessage(hSpin, WM_LBUTTONUP, 0, 0);
-}

@@ -62,6 +62,4 @@ private:
     KVXString FormatValue(double dValue);
     // Shows lOffset deltas from the middle value, or the given range end outside the range.
     int StepTo(long lOffset, bool bUpward);
-    // Posts a release to the spin, ending an auto-repeat that ran into a bad value.
-    void ReleaseSpin();
 };

@@ -16,8 +16,8 @@ BEGIN_MESSAGE_MAP(KVXEdit, CEdit)
     ON_WM_CHAR()
     ON_WM_KILLFOCUS()
     ON_WM_SETFOCUS()
-    ON_CONTROL_REFLECT_EX(EN_CHANGE, OnChange)
-    ON_MESSAGE(WM_KVX_SHOWERRORMESSAGE, OnShowErrorMessage)
+    ON_CONTROL_REFLECT_EX(EN_CHANGE, &KVXEdit::OnChange)
+    ON_MESSAGE(WM_KVX_SHOWERRORMESSAGE, &KVXEdit::OnShowErrorMessage)
 END_MESSAGE_MAP()
 
 /////////////////////////////////////////////////////////////////////////////
@@ -221,6 +221,15 @@ void PASCAL KVXEdit::PostShowError(KVXEdit* pEdit)
         ::PostMessage(pEdit->m_hWnd, WM_KVX_SHOWERRORMESSAGE, 0, 0);
 }
 
+// The window is gone, possibly while this edit's message box is up: the object may get
+// a new window (a dialog opened again), which starts without a box and without focus.
+void KVXEdit::PostNcDestroy()
+{
+    m_bShowingError = FALSE;
+    m_bFocusSet = FALSE;
+    CEdit::PostNcDestroy();
+}
+
 /////////////////////////////////////////////////////////////////////////////
 // Thread hooks
 
@@ -344,7 +353,8 @@ LRESULT KVXEdit::OnShowErrorMessage(WPARAM, LPARAM)
     ResetOwnMessage();
     m_bShowingError = TRUE;
     AfxMessageBox(m_strErrorMessage, 0, 0);
-    // The host may have destroyed the field from inside the box's message loop.
+    // The host may have destroyed the field (and this object with it) from inside the
+    // box's message loop: PostNcDestroy has then ended the showing state already.
     if (!::IsWindow(hWnd) || m_hWnd != hWnd)
         return 0;
     m_bShowingError = FALSE;

@@ -56,6 +56,7 @@ protected:
     // Checks a whole text: stores the value in m_varValue and returns TRUE, or stores the
     // message (and error position) and returns FALSE.
     virtual int SyntaxCheck(KVXString strText) = 0;
+    virtual void PostNcDestroy();
 
 // Implementation for the subclasses
 protected:

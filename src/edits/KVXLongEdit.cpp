@@ -116,18 +116,7 @@ KVXVariant KVXLongEdit::GetValueAsVariant(int bCommit)
 void KVXLongEdit::SetRange(KVXVariant varMin, KVXVariant varMax, int bMinInclude, int bMaxInclude)
 {
     KVXNumericEdit::SetRange(varMin, varMax, bMinInclude, bMaxInclude);
-    if (IsInRange(m_varValue))
-        return;
-    long lCur = 0;
-    long lLower = 0;
-    long lUpper = 0;
-    m_varValue.GetAs(lCur, 1);
-    GetMinimumInRange().GetAs(lLower, 1);
-    GetMaximumInRange().GetAs(lUpper, 1);
-    if (NumberFormat::LowerEndIsNearer(lLower, lUpper, lCur))
-        SetValueAsVariant(KVXVariant(lLower), TRUE);
-    else
-        SetValueAsVariant(KVXVariant(lUpper), TRUE);
+    MoveIntoRange(true);
 }
 
 KVXVariant KVXLongEdit::GetMinimum()
@@ -157,14 +146,8 @@ int KVXLongEdit::SyntaxCheck(int bShow)
 
 int KVXLongEdit::CharCheck(WCHAR c)
 {
-    if ((::GetKeyState(VK_CONTROL) & 0x8000) && c == NumberFormat::kUndoChar)
-    {
-        if (!m_bUndefined)
-            SetValueAsVariant(m_varCommitted, TRUE);
-        else if (::IsWindow(m_hWnd))
-            SetWindowText(_T(""));
+    if (HandleUndoChar(c))
         return FALSE;
-    }
     if (NumberFormat::IsLongEditChar(c))
         return TRUE;
     ::MessageBeep(0xFFFFFFFF);
@@ -222,20 +205,7 @@ int KVXLongEdit::SyntaxCheck(KVXString strText)
 
 void KVXLongEdit::SetMiddleVal(int)
 {
-    if (GetUndefined())
-    {
-        // Stepping out of an undefined field starts at 0, or at the lowest value allowed.
-        if (IsInRange(KVXVariant(0L)))
-        {
-            SetValueAsVariant(KVXVariant(0L), FALSE);
-        }
-        else
-        {
-            long lLower = 0;
-            GetMinimumInRange().GetAs(lLower, 1);
-            SetValueAsVariant(KVXVariant(lLower), FALSE);
-        }
-    }
+    StartFromUndefined(KVXVariant(0L));
     if (KVXEdit::SyntaxCheck(FALSE))
     {
         long lValue = 0;
@@ -277,9 +247,3 @@ int KVXLongEdit::StepTo(long lOffset, bool bUpward)
     return FALSE;
 }
 
-void KVXLongEdit::ReleaseSpin()
-{
-    HWND hSpin = GetSpinHwnd();
-    if (m_bSpinButton && hSpin != NULL)
-        ::PostMessage(hSpin, WM_LBUTTONUP, 0, 0);
-}

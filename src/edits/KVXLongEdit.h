@@ -64,6 +64,4 @@ private:
     void BinaryToKVXString(long lValue, KVXString& strOut);
     // Shows middle value + offset, or the given range end when the sum falls outside.
     int StepTo(long lOffset, bool bUpward);
-    // Posts a release to the spin, ending an auto-repeat that ran into a bad value.
-    void ReleaseSpin();
 };

@@ -1,6 +1,9 @@
 #include "KVXNumericEdit.h"
 
+#include <afxstat_.h>
+
 #include "KVXSpin.h"
+#include "NumberFormat.h"
 #include "SpinGeometry.h"
 
 BEGIN_MESSAGE_MAP(KVXNumericEdit, KVXEdit)
@@ -9,7 +12,7 @@ BEGIN_MESSAGE_MAP(KVXNumericEdit, KVXEdit)
     ON_WM_KILLFOCUS()
     ON_WM_SETFOCUS()
     ON_WM_DESTROY()
-    ON_CONTROL_REFLECT_EX(EN_CHANGE, OnChange)
+    ON_CONTROL_REFLECT_EX(EN_CHANGE, &KVXNumericEdit::OnChange)
 END_MESSAGE_MAP()
 
 /////////////////////////////////////////////////////////////////////////////
@@ -142,7 +145,11 @@ int KVXNumericEdit::GetMaximumInclude()
 
 void KVXNumericEdit::PreSubclassWindow()
 {
-    if (::IsWindow(m_hWnd))
+    // During Create the framework still holds this object as the one being created:
+    // Create initialises once the window is complete. Otherwise an existing window (a
+    // dialog control) is being subclassed and is initialised here.
+    const bool bCreating = AfxGetThreadState()->m_pWndInit == this;
+    if (!bCreating && ::IsWindow(m_hWnd))
     {
         CWnd* pParent = CWnd::FromHandle(::GetParent(m_hWnd));
         CRect rect;
@@ -164,26 +171,16 @@ int KVXNumericEdit::SyntaxCheck(int bShow)
 
 void KVXNumericEdit::Initialize(const RECT& rect, CWnd* pParentWnd)
 {
-    // A window made by Create may be initialised twice (once while the framework attaches
-    // it, once by Create itself): keep the one spin object, and rebuild its window only
-    // when the place has changed.
-    const bool bSamePlace = m_pSpin != NULL && m_pParentWnd == pParentWnd && m_rectCreate == rect;
     m_pParentWnd = pParentWnd;
     m_rectCreate = rect;
+    // A repeated call (Create on an object that has its window) keeps the one spin.
     if (m_pSpin == NULL)
         m_pSpin = new KVXSpin;
-    if (!bSamePlace && GetSpinHwnd() != NULL)
-    {
-        m_pSpin->DestroyWindow();
-        m_bSpinButton = TRUE;
-    }
-
-    if (m_bSpinButton && GetSpinHwnd() == NULL)
+    if (m_bSpinButton)
     {
         m_bSpinButton = FALSE;
         SetSpinButtonFlag(TRUE);
     }
-
     SetValueAsVariant(GetValueAsVariant(TRUE), TRUE);
 }
 
@@ -208,6 +205,62 @@ int KVXNumericEdit::SpinKeyPointY() const
     if (hSpin != NULL)
         ::GetWindowRect(hSpin, &rectSpin);
     return rectSpin.Height() - 3;
+}
+
+BOOL KVXNumericEdit::HandleUndoChar(WCHAR c)
+{
+    if (!(::GetKeyState(VK_CONTROL) & 0x8000) || c != NumberFormat::kUndoChar)
+        return FALSE;
+    if (!m_bUndefined)
+        SetValueAsVariant(m_varCommitted, TRUE);
+    else if (::IsWindow(m_hWnd))
+        SetWindowText(_T(""));
+    return TRUE;
+}
+
+void KVXNumericEdit::MoveIntoRange(bool bWholeNumbers)
+{
+    if (IsInRange(m_varValue))
+        return;
+    KVXVariant varLower = GetMinimumInRange();
+    KVXVariant varUpper = GetMaximumInRange();
+    bool bLowerIsNearer = false;
+    if (bWholeNumbers)
+    {
+        long lCur = 0;
+        long lLower = 0;
+        long lUpper = 0;
+        m_varValue.GetAs(lCur, 1);
+        varLower.GetAs(lLower, 1);
+        varUpper.GetAs(lUpper, 1);
+        bLowerIsNearer = NumberFormat::LowerEndIsNearer(lLower, lUpper, lCur);
+    }
+    else
+    {
+        double dCur = 0.0;
+        double dLower = 0.0;
+        double dUpper = 0.0;
+        m_varValue.GetAs(dCur);
+        varLower.GetAs(dLower);
+        varUpper.GetAs(dUpper);
+        bLowerIsNearer = NumberFormat::LowerEndIsNearer(dLower, dUpper, dCur);
+    }
+    // Each subclass shows an end the way it reads it, as in the comparison above.
+    SetValueAsVariant(bLowerIsNearer ? varLower : varUpper, TRUE);
+}
+
+void KVXNumericEdit::StartFromUndefined(const KVXVariant& varZero)
+{
+    if (!GetUndefined())
+        return;
+    SetValueAsVariant(IsInRange(varZero) ? varZero : GetMinimumInRange(), FALSE);
+}
+
+void KVXNumericEdit::ReleaseSpin()
+{
+    HWND hSpin = GetSpinHwnd();
+    if (m_bSpinButton && hSpin != NULL)
+        ::PostMessage(hSpin, WM_LBUTTONUP, 0, 0);
 }
 
 void KVXNumericEdit::RestoreCommitted()

@@ -85,6 +85,18 @@ protected:
     // The spin's window, or NULL when it has none: messages to a missing spin go nowhere.
     HWND GetSpinHwnd() const;
 
+    // Shared by the integer and floating-point edits.
+    // Ctrl+Z: shows the committed value again (committed), or empties an undefined field.
+    // TRUE when c was that key while Ctrl is down: the character is then swallowed.
+    BOOL HandleUndoChar(WCHAR c);
+    // A current value outside the range moves, committed, to the nearer in-range end
+    // (equal distances: the upper one), compared as whole numbers or as doubles.
+    void MoveIntoRange(bool bWholeNumbers);
+    // An undefined field starts a step sequence at zero, or at the lowest value allowed.
+    void StartFromUndefined(const KVXVariant& varZero);
+    // Posts a release to the spin, ending an auto-repeat that ran into a bad value.
+    void ReleaseSpin();
+
 private:
     void Initialize(const RECT& rect, CWnd* pParentWnd);
     void PressSpin(UINT nMessage, int y);

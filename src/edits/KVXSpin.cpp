@@ -209,12 +209,19 @@ void KVXSpin::OnPaint()
     drawInvertTriangle(&dc, CRect(SpinGeometry::GlyphRect(rectLower, m_bDownPressed != FALSE)));
 }
 
+// A step changes the buddy's text, and the host's EN_CHANGE handler may destroy the
+// buddy, which destroys and deletes this spin: the handlers look at their window again
+// after every step and leave the object alone once it is gone.
+
 void KVXSpin::OnLButtonDown(UINT nFlags, CPoint point)
 {
     KVXNumericEdit* pBuddy = GetBuddy();
     if (pBuddy == NULL)
         return;
+    const HWND hWnd = m_hWnd;
     pBuddy->SetFocus();
+    if (!::IsWindow(hWnd))
+        return;
 
     const SpinArea area = SpinGeometry::HitTest(m_rcClient.Width(), m_rcClient.Height(), point);
     if (area == SpinArea::Up || area == SpinArea::Down)
@@ -242,10 +249,11 @@ void KVXSpin::OnLButtonDown(UINT nFlags, CPoint point)
         SetCapture();
         m_bCaptured = TRUE;
         m_bSliding = TRUE;
-        pBuddy->OnSliderSet(TRUE);
         m_ptPress = point;
+        pBuddy->OnSliderSet(TRUE);
     }
-    Default();
+    if (::IsWindow(hWnd))
+        Default();
 }
 
 void KVXSpin::OnLButtonDblClk(UINT nFlags, CPoint point)
@@ -271,10 +279,13 @@ void KVXSpin::OnTimer(UINT_PTR nIDEvent)
     const SpinGeometry::TickActions actions = SpinGeometry::TickRule(m_nTimerTicks);
     if (actions.step)
     {
+        const HWND hWnd = m_hWnd;
         if (m_bSpinUp)
             pBuddy->OnSpinUpButton();
         else
             pBuddy->OnSpinDownButton();
+        if (!::IsWindow(hWnd))
+            return;
     }
     if (actions.twoSecs)
         pBuddy->OnSpinTimerTwoSecs();
@@ -332,7 +343,12 @@ void KVXSpin::OnMouseMove(UINT nFlags, CPoint point)
     }
 
     if (m_bCaptured && m_bSliding)
+    {
+        const HWND hWnd = m_hWnd;
         pBuddy->OnSliderMove(SpinGeometry::SliderDistance(m_ptPress, point));
+        if (!::IsWindow(hWnd))
+            return;
+    }
 
     // Dragging off a half held by the mouse ends its repeat; a key's hold ignores the pointer.
     if (m_bCaptured && !m_bKeyDown)

@@ -62,7 +62,7 @@ bool ReadClipboardText(std::wstring& text, HANDLE& hLocked)
 } // namespace
 
 BEGIN_MESSAGE_MAP(KVXStringEdit, KVXEdit)
-    ON_MESSAGE(WM_PASTE, OnPaste)
+    ON_MESSAGE(WM_PASTE, &KVXStringEdit::OnPaste)
 END_MESSAGE_MAP()
 
 KVXStringEdit::KVXStringEdit(int bReplaceSpecialChars, int bAcceptSingleBackslash)

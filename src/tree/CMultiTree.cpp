@@ -28,30 +28,26 @@ bool ReadSelectionAndIntegral(HWND hwnd, HTREEITEM hItem, bool& bSelected, int& 
 
 // The band's frame: one pixel wide, XOR-drawn with the halftone pattern, so that
 // drawing the same rectangle again erases it.
-class BandFrame
+void ToggleBandFrame(CDC& dc, const CRect& rc)
 {
-public:
-    void Toggle(CDC& dc, const CRect& rc)
+    CBrush* pBrush = CDC::GetHalftoneBrush();
+    if (pBrush == NULL || rc.IsRectEmpty())
+        return;
+    CBrush* pOld = dc.SelectObject(pBrush);
+    const int w = rc.Width();
+    const int h = rc.Height();
+    // Each pixel of the frame exactly once: top and bottom rows, then the sides between.
+    dc.PatBlt(rc.left, rc.top, w, 1, PATINVERT);
+    if (h > 1)
+        dc.PatBlt(rc.left, rc.bottom - 1, w, 1, PATINVERT);
+    if (h > 2)
     {
-        CBrush* pBrush = CDC::GetHalftoneBrush();
-        if (pBrush == NULL || rc.IsRectEmpty())
-            return;
-        CBrush* pOld = dc.SelectObject(pBrush);
-        const int w = rc.Width();
-        const int h = rc.Height();
-        // Each pixel of the frame exactly once: top and bottom rows, then the sides between.
-        dc.PatBlt(rc.left, rc.top, w, 1, PATINVERT);
-        if (h > 1)
-            dc.PatBlt(rc.left, rc.bottom - 1, w, 1, PATINVERT);
-        if (h > 2)
-        {
-            dc.PatBlt(rc.left, rc.top + 1, 1, h - 2, PATINVERT);
-            if (w > 1)
-                dc.PatBlt(rc.right - 1, rc.top + 1, 1, h - 2, PATINVERT);
-        }
-        dc.SelectObject(pOld);
+        dc.PatBlt(rc.left, rc.top + 1, 1, h - 2, PATINVERT);
+        if (w > 1)
+            dc.PatBlt(rc.right - 1, rc.top + 1, 1, h - 2, PATINVERT);
     }
-};
+    dc.SelectObject(pOld);
+}
 
 } // namespace
 
@@ -61,8 +57,8 @@ BEGIN_MESSAGE_MAP(CMultiTree, KVXMultiTreeBase)
     ON_WM_LBUTTONDOWN()
     ON_WM_SETFOCUS()
     ON_WM_KILLFOCUS()
-    ON_NOTIFY_REFLECT_EX(TVN_ITEMEXPANDINGW, OnItemExpanding)
-    ON_NOTIFY_REFLECT_EX(TVN_DELETEITEMW, OnDeleteItem)
+    ON_NOTIFY_REFLECT_EX(TVN_ITEMEXPANDINGW, &CMultiTree::OnItemExpanding)
+    ON_NOTIFY_REFLECT_EX(TVN_DELETEITEMW, &CMultiTree::OnDeleteItem)
     ON_WM_KEYDOWN()
 END_MESSAGE_MAP()
 
@@ -453,11 +449,14 @@ void CMultiTree::DoAction(HTREEITEM hItem, BOOL bLeft, UINT nFlags, CPoint point
     enum class Outcome { None, Click, Drag };
     Outcome outcome = Outcome::None;
 
+    // The loop holds the handle, not the object: a window destroyed by a dispatched
+    // message loses the capture, which ends the loop before anything touches this.
+    const HWND hWnd = m_hWnd;
     SetCapture();
     const int cxDrag = ::GetSystemMetrics(SM_CXDRAG);
     const int cyDrag = ::GetSystemMetrics(SM_CYDRAG);
     MSG msg;
-    while (outcome == Outcome::None && ::GetCapture() == m_hWnd)
+    while (outcome == Outcome::None && ::GetCapture() == hWnd)
     {
         const BOOL bGot = ::GetMessage(&msg, NULL, 0, 0);
         if (bGot == 0)
@@ -468,7 +467,7 @@ void CMultiTree::DoAction(HTREEITEM hItem, BOOL bLeft, UINT nFlags, CPoint point
         }
         if (bGot == -1)
             break;
-        if (::GetCapture() != m_hWnd)
+        if (::GetCapture() != hWnd)
         {
             ::DispatchMessage(&msg);
             break;
@@ -491,8 +490,10 @@ void CMultiTree::DoAction(HTREEITEM hItem, BOOL bLeft, UINT nFlags, CPoint point
             break;
         }
     }
+    if (!::IsWindow(hWnd))
+        return;     // the object may have gone with its window
     // Release only our own capture: another window may have taken it.
-    if (::GetCapture() == m_hWnd)
+    if (::GetCapture() == hWnd)
         ::ReleaseCapture();
 
     if (outcome == Outcome::Click)
@@ -519,41 +520,44 @@ void CMultiTree::DoAction(HTREEITEM hItem, BOOL bLeft, UINT nFlags, CPoint point
 /////////////////////////////////////////////////////////////////////////////
 // Mouse: rubber band
 
+// One rubber-band press: where it started and what is on screen.
+struct CMultiTree::BandLoop
+{
+    POINT ptStart;          // the press point in content coordinates
+    CRect rcClient;
+    int cxDrag;
+    int cyDrag;
+    int nItemHeight;        // the tree scrolls vertically by rows of this height
+    bool bKeep;             // Shift or Ctrl: the selection before the press stays
+    bool bStarted;          // the pointer has left the drag distance
+    bool bDrawn;            // a frame is on screen at rcDrawn
+    CRect rcDrawn;
+};
+
 void CMultiTree::DoBanding(BOOL bLeft, UINT nFlags, CPoint point)
 {
-    if (::GetFocus() != m_hWnd)
+    // As in DoAction, the loop ends with the window's capture and then leaves this alone.
+    const HWND hWnd = m_hWnd;
+    if (::GetFocus() != hWnd)
         SetFocus();
     SetCapture();
 
-    const bool bKeep = (nFlags & (MK_SHIFT | MK_CONTROL)) != 0;
+    BandLoop band = StartBand(point, nFlags);
     SelectionSnapshot snapshot;
-    if (bKeep)
+    if (band.bKeep)
     {
         CTypedPtrList<CPtrList, HTREEITEM> listSelected(10);
         GetSelectedList(listSelected);
         for (POSITION pos = listSelected.GetHeadPosition(); pos != NULL;)
             snapshot.Add(listSelected.GetNext(pos));
     }
-
     CClientDC dc(this);
-    CRect rcClient;
-    GetClientRect(&rcClient);
-    const int cxDrag = ::GetSystemMetrics(SM_CXDRAG);
-    const int cyDrag = ::GetSystemMetrics(SM_CYDRAG);
     SetTimer(kBandTimer, kBandTimerMs, NULL);
 
-    // The tree scrolls vertically by rows of the base item height.
-    const int nItemHeight = GetRootItem() != NULL ? GetItemHeight() : 0;
-    const POINT ptStart = ClientToContent(point, GetScrollPos(SB_HORZ), GetScrollPos(SB_VERT), nItemHeight);
-
-    BandFrame frame;
-    bool bStarted = false;
-    bool bDrawn = false;
-    CRect rcDrawn;
     bool bEndMessage = false;   // msg ended the loop and is dispatched afterwards
     bool bQuit = false;
     MSG msg;
-    while (::GetCapture() == m_hWnd)
+    while (::GetCapture() == hWnd)
     {
         const BOOL bGot = ::GetMessage(&msg, NULL, 0, 0);
         if (bGot == 0)
@@ -563,15 +567,7 @@ void CMultiTree::DoBanding(BOOL bLeft, UINT nFlags, CPoint point)
         }
         if (bGot == -1)
             break;
-        if (::GetCapture() != m_hWnd)
-        {
-            bEndMessage = true;
-            break;
-        }
-
-        bool bMove = false;
-        CPoint pt;
-        if (msg.message == WM_LBUTTONUP || msg.message == WM_RBUTTONUP)
+        if (::GetCapture() != hWnd || msg.message == WM_LBUTTONUP || msg.message == WM_RBUTTONUP)
         {
             bEndMessage = true;
             break;
@@ -582,68 +578,95 @@ void CMultiTree::DoBanding(BOOL bLeft, UINT nFlags, CPoint point)
             bEndMessage = true;
             break;
         }
-        if (msg.message == WM_MOUSEMOVE)
-        {
-            pt = CPoint(GET_X_LPARAM(msg.lParam), GET_Y_LPARAM(msg.lParam));
-            bMove = true;
-        }
-        else if (msg.message == WM_TIMER && msg.hwnd == m_hWnd && msg.wParam == kBandTimer)
-        {
-            // Holding the pointer outside keeps scrolling, one line per tick.
-            pt = msg.pt;
-            ScreenToClient(&pt);
-            bMove = !rcClient.PtInRect(pt);
-        }
-        if (!bMove)
-        {
+        CPoint pt;
+        if (BandPointFromMessage(msg, band, pt))
+            MoveBand(dc, band, pt, nFlags, snapshot);
+        else
             ::DispatchMessage(&msg);
-            continue;
-        }
-
-        if (!bStarted)
-        {
-            const POINT ptPress = ContentToClient(ptStart, GetScrollPos(SB_HORZ), GetScrollPos(SB_VERT), nItemHeight);
-            if (!ExceedsDragDistance(ptPress, pt, cxDrag, cyDrag))
-                continue;
-            bStarted = true;
-            if (!bKeep)
-                SelectAll(FALSE);
-            UpdateWindow();
-        }
-        if (bDrawn)
-        {
-            frame.Toggle(dc, rcDrawn);
-            bDrawn = false;
-        }
-        const AutoScroll scroll = AutoScrollFor(pt, rcClient);
-        if (scroll.vertical != 0)
-            SendMessage(WM_VSCROLL, MAKEWPARAM(scroll.vertical < 0 ? SB_LINEUP : SB_LINEDOWN, 0), 0);
-        if (scroll.horizontal != 0)
-            SendMessage(WM_HSCROLL, MAKEWPARAM(scroll.horizontal < 0 ? SB_LINELEFT : SB_LINERIGHT, 0), 0);
-
-        const CRect rcBand = BandRect(ptStart, GetScrollPos(SB_HORZ), GetScrollPos(SB_VERT), nItemHeight, pt);
-        UpdateSelectionForRect(&rcBand, nFlags, snapshot);
-        frame.Toggle(dc, rcBand);
-        rcDrawn = rcBand;
-        bDrawn = true;
     }
 
+    // Destroyed inside the loop: timer, capture and the window's DC went with it.
+    if (::IsWindow(hWnd))
+        EndBand(dc, band, bLeft);
+    if (bQuit)
+        ::PostQuitMessage((int)msg.wParam);
+    else if (bEndMessage)
+        ::DispatchMessage(&msg);
+}
+
+CMultiTree::BandLoop CMultiTree::StartBand(CPoint point, UINT nFlags)
+{
+    BandLoop band = {};
+    GetClientRect(&band.rcClient);
+    band.cxDrag = ::GetSystemMetrics(SM_CXDRAG);
+    band.cyDrag = ::GetSystemMetrics(SM_CYDRAG);
+    band.nItemHeight = GetRootItem() != NULL ? GetItemHeight() : 0;
+    band.ptStart = ClientToContent(point, GetScrollPos(SB_HORZ), GetScrollPos(SB_VERT), band.nItemHeight);
+    band.bKeep = (nFlags & (MK_SHIFT | MK_CONTROL)) != 0;
+    return band;
+}
+
+BOOL CMultiTree::BandPointFromMessage(const MSG& msg, const BandLoop& band, CPoint& pt)
+{
+    if (msg.message == WM_MOUSEMOVE)
+    {
+        pt = CPoint(GET_X_LPARAM(msg.lParam), GET_Y_LPARAM(msg.lParam));
+        return TRUE;
+    }
+    if (msg.message == WM_TIMER && msg.hwnd == m_hWnd && msg.wParam == kBandTimer)
+    {
+        // Holding the pointer outside keeps scrolling, one line per tick.
+        pt = msg.pt;
+        ScreenToClient(&pt);
+        return !band.rcClient.PtInRect(pt);
+    }
+    return FALSE;
+}
+
+void CMultiTree::MoveBand(CDC& dc, BandLoop& band, CPoint pt, UINT nFlags, SelectionSnapshot& snapshot)
+{
+    if (!band.bStarted)
+    {
+        const POINT ptPress = ContentToClient(band.ptStart, GetScrollPos(SB_HORZ), GetScrollPos(SB_VERT),
+                                              band.nItemHeight);
+        if (!ExceedsDragDistance(ptPress, pt, band.cxDrag, band.cyDrag))
+            return;
+        band.bStarted = true;
+        if (!band.bKeep)
+            SelectAll(FALSE);
+        UpdateWindow();
+    }
+    if (band.bDrawn)
+    {
+        ToggleBandFrame(dc, band.rcDrawn);
+        band.bDrawn = false;
+    }
+    const AutoScroll scroll = AutoScrollFor(pt, band.rcClient);
+    if (scroll.vertical != 0)
+        SendMessage(WM_VSCROLL, MAKEWPARAM(scroll.vertical < 0 ? SB_LINEUP : SB_LINEDOWN, 0), 0);
+    if (scroll.horizontal != 0)
+        SendMessage(WM_HSCROLL, MAKEWPARAM(scroll.horizontal < 0 ? SB_LINELEFT : SB_LINERIGHT, 0), 0);
+
+    const CRect rcBand = BandRect(band.ptStart, GetScrollPos(SB_HORZ), GetScrollPos(SB_VERT), band.nItemHeight, pt);
+    UpdateSelectionForRect(&rcBand, nFlags, snapshot);
+    ToggleBandFrame(dc, rcBand);
+    band.rcDrawn = rcBand;
+    band.bDrawn = true;
+}
+
+void CMultiTree::EndBand(CDC& dc, const BandLoop& band, BOOL bLeft)
+{
     KillTimer(kBandTimer);
     if (::GetCapture() == m_hWnd)
         ::ReleaseCapture();
-    if (bDrawn)
-        frame.Toggle(dc, rcDrawn);
-    else if (!bKeep)
+    if (band.bDrawn)
+        ToggleBandFrame(dc, band.rcDrawn);
+    else if (!band.bKeep)
         SelectAll(FALSE);   // a plain click on empty space clears the selection
 
     NMHDR hdr = {};
     hdr.code = bLeft ? NM_CLICK : NM_RCLICK;
     _SendNotify(&hdr);
-
-    if (bQuit)
-        ::PostQuitMessage((int)msg.wParam);
-    else if (bEndMessage)
-        ::DispatchMessage(&msg);
 }
 
 void CMultiTree::UpdateSelectionForRect(LPCRECT pRect, UINT nFlags, SelectionSnapshot& snapshot)

@@ -67,6 +67,15 @@ protected:
     BOOL m_bBandingHit;
 
 private:
+    // The steps of DoBanding.
+    struct BandLoop;
+    BandLoop StartBand(CPoint point, UINT nFlags);
+    // The point a band message moves to: a mouse move, or a timer tick with the pointer outside.
+    BOOL BandPointFromMessage(const MSG& msg, const BandLoop& band, CPoint& pt);
+    void MoveBand(CDC& dc, BandLoop& band, CPoint pt, UINT nFlags, TreeSelectionMath::SelectionSnapshot& snapshot);
+    // Timer, capture, frame or cleared selection, NM_CLICK or NM_RCLICK.
+    void EndBand(CDC& dc, const BandLoop& band, BOOL bLeft);
+
     BOOL SendSelectionNotify(UINT nCode, HTREEITEM hItem, bool bSelecting);
     BOOL SendItemNotify(UINT nCode, HTREEITEM hItem, CPoint point);
     HTREEITEM VisibleEndpoint(HTREEITEM hItem) const;

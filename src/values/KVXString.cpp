@@ -57,17 +57,17 @@ const KVXString& KVXString::operator=(const unsigned char* psz)
 
 KVTEnumConvertType KVXString::GetAs(long& lValue, int& nErrorPos) const
 {
-    return KvtParseLong(m_pchData, GetLength(), lValue, nErrorPos);
+    return KvtParseLong(static_cast<LPCTSTR>(*this), GetLength(), lValue, nErrorPos);
 }
 
 KVTEnumConvertType KVXString::GetAs(double& dValue, int& nErrorPos) const
 {
-    return KvtParseDouble(m_pchData, GetLength(), dValue, nErrorPos);
+    return KvtParseDouble(static_cast<LPCTSTR>(*this), GetLength(), dValue, nErrorPos);
 }
 
 int KVXString::GetBase() const
 {
-    return KvtNumberBase(m_pchData, GetLength());
+    return KvtNumberBase(static_cast<LPCTSTR>(*this), GetLength());
 }
 
 void AFX_CDECL KVXString::Format(LPCTSTR lpszFormat, ...)

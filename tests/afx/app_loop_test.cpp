@@ -2,9 +2,9 @@
 // Covers:
 // - the start-up done by the test main: AfxGetApp, AfxGetThread, the instance and
 //   resource handles, the application name
-// - PumpMessage: PreTranslateMessage from the message's window up to its
-//   top-level window (child, parent, top); a window that takes the message stops
-//   the walk and the dispatch
+// - PumpMessage: PreTranslateMessage from the message's window up through its
+//   parents and a pop-up's owner (child, parent, top); a window that takes the
+//   message stops the walk and the dispatch
 // - AfxMessageBox: shown with the application name as caption and the exact
 //   text, owned by the active top-level window (disabled meanwhile), returning
 //   the button that answered it
@@ -103,16 +103,16 @@ TEST_F(AppPumpMessage, AWindowThatTakesTheMessageEndsTheWalkAndTheDispatch)
     EXPECT_EQ(0, child.m_nKeyDowns);
 }
 
-TEST_F(AppPumpMessage, WalkStopsAtTheTopLevelWindow)
+TEST_F(AppPumpMessage, WalkGoesOnFromAPopupToItsOwner)
 {
-    // A pop-up owned by the top window: its owner is not part of the walk.
+    // ::GetParent of a pop-up is its owner: the owner takes part in the walk.
     CWalkWnd popup;
     popup.m_pTrace = &trace;
     popup.m_pszName = "popup";
     ASSERT_TRUE(popup.CreateEx(0, NULL, L"popup", WS_POPUP, CRect(0, 0, 50, 50), &top, 0));
     popup.PostMessage(WM_KEYDOWN, 'A', 1);
     PumpOne();
-    EXPECT_EQ("popup;", trace);
+    EXPECT_EQ("popup;top;", trace);
     EXPECT_EQ(1, popup.m_nKeyDowns);
     popup.DestroyWindow();
 }

@@ -6,10 +6,11 @@
 //   element lifetimes, empty-list errors
 // - CMap with HWND and pointer keys (64-bit values), block size, InitHashTable
 //   with entries kept, PLookup, RemoveKey, iteration visiting each entry once
-// - CTypedPtrList/CTypedPtrArray/CTypedPtrMap over the untyped collections
-// - untyped collections: CStringArray, CStringList, CMapStringToPtr, CMapWordToPtr
+// - CTypedPtrList/CTypedPtrArray/CTypedPtrMap over the untyped collections, and the
+//   untyped collections the library uses
 #include <gtest/gtest.h>
 #include <afxtempl.h>
+#include <functional>
 #include <map>
 #include <set>
 #include <string>
@@ -41,39 +42,17 @@ std::string Join(const ARRAY& a)
 {
     std::string s;
     for (INT_PTR i = 0; i < a.GetSize(); i++)
-    {
-        if (i != 0)
-            s += ',';
-        s += std::to_string(a[i]);
-    }
+        s += (i ? "," : "") + std::to_string(a[i]);
     return s;
 }
 
+// The list's elements from the head, or from the tail backwards.
 template<class LIST>
-std::string JoinList(const LIST& l)
+std::string JoinList(const LIST& l, bool backwards = false)
 {
     std::string s;
-    POSITION pos = l.GetHeadPosition();
-    while (pos != NULL)
-    {
-        if (!s.empty())
-            s += ',';
-        s += std::to_string(l.GetNext(pos));
-    }
-    return s;
-}
-
-template<class LIST>
-std::string JoinListBackwards(const LIST& l)
-{
-    std::string s;
-    POSITION pos = l.GetTailPosition();
-    while (pos != NULL)
-    {
-        if (!s.empty())
-            s += ',';
-        s += std::to_string(l.GetPrev(pos));
-    }
+    for (POSITION pos = backwards ? l.GetTailPosition() : l.GetHeadPosition(); pos != NULL;)
+        s += (s.empty() ? "" : ",") + std::to_string(backwards ? l.GetPrev(pos) : l.GetNext(pos));
     return s;
 }
 
@@ -114,8 +93,11 @@ TEST(CArrayTest, InsertAndRemoveAtEdges)
     a.InsertAt(5, 7);                 // past the end: the gap is zero-filled
     EXPECT_EQ("2,3,0,0,0,7", Join(a));
     a.RemoveAt(0, a.GetSize());
-    EXPECT_EQ(0, a.GetSize());
     EXPECT_EQ(-1, a.GetUpperBound());
+    a.Add(1);
+    a.Add(2);
+    a.InsertAt(1, &a);   // an array into itself
+    EXPECT_EQ("1,1,2,2", Join(a));
 }
 
 TEST(CArrayTest, SetSizeGrowByAndFreeExtra)
@@ -178,23 +160,13 @@ TEST(CArrayTest, OutOfRangeThrowsInvalidArg)
 {
     CArray<int, int> a;
     a.Add(1);
-    EXPECT_TRUE(ThrowsInvalidArg([&] { a.GetAt(1); }));
-    EXPECT_TRUE(ThrowsInvalidArg([&] { a.GetAt(-1); }));
-    EXPECT_TRUE(ThrowsInvalidArg([&] { a.SetAt(5, 1); }));
-    EXPECT_TRUE(ThrowsInvalidArg([&] { a.RemoveAt(0, 2); }));
-    EXPECT_TRUE(ThrowsInvalidArg([&] { a.RemoveAt(-1); }));
-    EXPECT_TRUE(ThrowsInvalidArg([&] { a.SetSize(-1); }));
-    EXPECT_TRUE(ThrowsInvalidArg([&] { a.InsertAt(-1, 0); }));
+    const std::function<void()> misuses[] = {
+        [&] { a.GetAt(1); }, [&] { a.GetAt(-1); }, [&] { a.SetAt(5, 1); }, [&] { a.RemoveAt(0, 2); },
+        [&] { a.RemoveAt(-1); }, [&] { a.SetSize(-1); }, [&] { a.InsertAt(-1, 0); },
+    };
+    for (size_t i = 0; i < sizeof misuses / sizeof misuses[0]; ++i)
+        EXPECT_TRUE(ThrowsInvalidArg(misuses[i])) << "misuse " << i;
     EXPECT_EQ("1", Join(a));
-}
-
-TEST(CArrayTest, InsertArrayIntoItself)
-{
-    CArray<int, int> a;
-    a.Add(1);
-    a.Add(2);
-    a.InsertAt(1, &a);
-    EXPECT_EQ("1,1,2,2", Join(a));
 }
 
 // ---------------------------------------------------------------------------
@@ -210,7 +182,7 @@ TEST(CListTest, InsertAndRemoveAtEdgesAndPositions)
     l.InsertBefore(l.GetHeadPosition(), 0);
     l.InsertAfter(l.GetTailPosition(), 5);
     EXPECT_EQ("0,1,2,3,4,5", JoinList(l));
-    EXPECT_EQ("5,4,3,2,1,0", JoinListBackwards(l));
+    EXPECT_EQ("5,4,3,2,1,0", JoinList(l, true));
     EXPECT_EQ(0, l.RemoveHead());
     EXPECT_EQ(5, l.RemoveTail());
     l.RemoveAt(p2);
@@ -220,7 +192,7 @@ TEST(CListTest, InsertAndRemoveAtEdgesAndPositions)
     l.RemoveAt(l.GetHeadPosition());
     l.RemoveAt(l.GetTailPosition());
     EXPECT_EQ("3", JoinList(l));
-    EXPECT_EQ("3", JoinListBackwards(l));
+    EXPECT_EQ("3", JoinList(l, true));
     l.RemoveAt(l.GetHeadPosition());
     EXPECT_EQ(0, l.GetCount());
     EXPECT_EQ(nullptr, l.GetHeadPosition());
@@ -228,6 +200,9 @@ TEST(CListTest, InsertAndRemoveAtEdgesAndPositions)
     l.InsertBefore(NULL, 7);          // NULL position: at the head
     l.InsertAfter(NULL, 8);           // NULL position: at the tail
     EXPECT_EQ("7,8", JoinList(l));
+    l.AddTail(&l);                    // a list to itself: doubled once
+    l.AddHead(&l);
+    EXPECT_EQ("7,8,7,8,7,8,7,8", JoinList(l));
 }
 
 TEST(CListTest, FindAndFindIndex)
@@ -278,17 +253,6 @@ TEST(CListTest, ElementLifetimesAndEmptyListErrors)
     EXPECT_TRUE(ThrowsInvalidArg([&] { empty.RemoveAt(NULL); }));
     POSITION pos = NULL;
     EXPECT_TRUE(ThrowsInvalidArg([&] { empty.GetNext(pos); }));
-}
-
-TEST(CListTest, AddListToItselfDoublesOnce)
-{
-    CList<int, int> l;
-    l.AddTail(1);
-    l.AddTail(2);
-    l.AddTail(&l);
-    EXPECT_EQ("1,2,1,2", JoinList(l));
-    l.AddHead(&l);
-    EXPECT_EQ("1,2,1,2,1,2,1,2", JoinList(l));
 }
 
 // ---------------------------------------------------------------------------
@@ -400,7 +364,7 @@ TEST(CMapTest, ValueLifetimes)
 }
 
 // ---------------------------------------------------------------------------
-// Typed pointer collections
+// Typed pointer collections and the untyped ones under them
 
 namespace {
 
@@ -413,27 +377,20 @@ public:
 
 } // namespace
 
-TEST(CTypedPtrListTest, OverObListAndPtrList)
+TEST(TypedPtrCollections, OverTheUntypedCollections)
 {
-    CTypedPtrList<CObList, CItem*> items;
     CItem a(1), b(2), c(3);
+    CTypedPtrList<CObList, CItem*> items;
     items.AddTail(&b);
     items.AddHead(&a);
     items.AddTail(&c);
-    EXPECT_EQ(3, items.GetCount());
-    EXPECT_EQ(1, items.GetHead()->m_n);
-    EXPECT_EQ(3, items.GetTail()->m_n);
     std::string order;
-    POSITION pos = items.GetHeadPosition();
-    while (pos != NULL)
+    for (POSITION pos = items.GetHeadPosition(); pos != NULL;)
         order += std::to_string(items.GetNext(pos)->m_n);
     EXPECT_EQ("123", order);
     EXPECT_EQ(&a, items.RemoveHead());
     EXPECT_EQ(&c, items.RemoveTail());
-    POSITION found = items.Find(&b);
-    ASSERT_NE(nullptr, found);
-    EXPECT_EQ(&b, items.GetAt(found));
-
+    EXPECT_EQ(&b, items.GetAt(items.Find(&b)));
     CTypedPtrList<CPtrList, int*> ptrs;
     int x = 5, y = 6;
     ptrs.AddTail(&x);
@@ -441,30 +398,16 @@ TEST(CTypedPtrListTest, OverObListAndPtrList)
     EXPECT_EQ(6, *ptrs.GetHead());
     ptrs.GetHead() = &x;
     EXPECT_EQ(5, *ptrs.GetHead());
-}
 
-TEST(CTypedPtrArrayTest, OverPtrArray)
-{
-    CTypedPtrArray<CPtrArray, CItem*> items;
-    CItem a(1), b(2);
-    items.Add(&a);
-    items.InsertAt(0, &b);
-    EXPECT_EQ(2, items.GetSize());
-    EXPECT_EQ(2, items[0]->m_n);
-    EXPECT_EQ(1, items.GetAt(1)->m_n);
-    items[1] = &b;
-    EXPECT_EQ(&b, items.GetData()[1]);
-}
+    CTypedPtrArray<CPtrArray, CItem*> array;
+    array.Add(&a);
+    array.InsertAt(0, &b);
+    EXPECT_EQ(2, array[0]->m_n);
+    EXPECT_EQ(&a, array.GetData()[1]);
 
-TEST(CTypedPtrMapTest, OverMapPtrToPtrAndStringToOb)
-{
     CTypedPtrMap<CMapPtrToPtr, HWND, CItem*> map;
-    CItem a(1);
     HWND h = (HWND)(UINT_PTR)0x123450;
     map.SetAt(h, &a);
-    CItem* pFound = NULL;
-    EXPECT_TRUE(map.Lookup(h, pFound));
-    EXPECT_EQ(&a, pFound);
     POSITION pos = map.GetStartPosition();
     HWND key = NULL;
     CItem* value = NULL;
@@ -473,81 +416,41 @@ TEST(CTypedPtrMapTest, OverMapPtrToPtrAndStringToOb)
     EXPECT_EQ(&a, value);
     EXPECT_EQ(nullptr, pos);
     EXPECT_TRUE(map.RemoveKey(h));
-    EXPECT_FALSE(map.Lookup(h, pFound));
+    EXPECT_FALSE(map.Lookup(h, value));
 
-    CTypedPtrMap<CMapStringToOb, CString, CItem*> byName;
-    byName[L"a"] = &a;
-    EXPECT_TRUE(byName.Lookup(L"a", pFound));
-    EXPECT_EQ(&a, pFound);
-}
-
-// ---------------------------------------------------------------------------
-// Untyped collections
-
-TEST(UntypedCollections, StringArrayAndList)
-{
-    CStringArray a;
-    a.Add(L"b");
-    a.Add(CString(L"c"));
-    a.InsertAt(0, L"a");
-    a.SetAtGrow(4, L"e");
-    EXPECT_EQ(5, a.GetSize());
-    EXPECT_EQ(L"a", W(a[0]));
-    EXPECT_EQ(L"", W(a[3]));
-    EXPECT_EQ(L"e", W(a.GetAt(4)));
-    a.RemoveAt(3);
-    CStringArray b;
-    b.Copy(a);
-    a[0] = L"changed";
-    EXPECT_EQ(L"a", W(b[0]));
-    EXPECT_STREQ("CStringArray", a.GetRuntimeClass()->m_lpszClassName);
-
-    CStringList l;
-    l.AddTail(L"x");
-    l.AddHead(L"w");
-    l.AddTail(CString(L"y"));
-    POSITION pos = l.Find(L"x");
-    ASSERT_NE(nullptr, pos);
-    EXPECT_EQ(L"x", W(l.GetAt(pos)));
-    EXPECT_EQ(nullptr, l.Find(L"z"));
-    EXPECT_EQ(L"w", W(l.RemoveHead()));
-    EXPECT_EQ(2, l.GetCount());
-}
-
-TEST(UntypedCollections, Maps)
-{
     CMapStringToPtr names;
-    int x = 0;
     names[L"key"] = &x;
-    names.SetAt(L"other", NULL);
     void* p = NULL;
     EXPECT_TRUE(names.Lookup(L"key", p));
     EXPECT_EQ(&x, p);
+    EXPECT_FALSE(names.Lookup(L"KEY", p)) << "keys compare case-sensitively";
     LPCTSTR pszKey = NULL;
     EXPECT_TRUE(names.LookupKey(L"key", pszKey));
     EXPECT_EQ(L"key", std::wstring(pszKey));
-    EXPECT_FALSE(names.Lookup(L"KEY", p)) << "keys compare case-sensitively";
-
     CMapWordToPtr words(2);
     for (WORD w = 0; w < 50; w++)
         words[w] = (void*)(UINT_PTR)(w + 1);
-    EXPECT_EQ(50, words.GetCount());
     EXPECT_TRUE(words.Lookup(49, p));
     EXPECT_EQ((void*)(UINT_PTR)50, p);
     words.RemoveAll();
-    EXPECT_EQ(0, words.GetCount());
     EXPECT_FALSE(words.Lookup(49, p));
-
     CMapPtrToWord ptrWords;
     ptrWords[&x] = 7;
-    WORD w = 0;
-    EXPECT_TRUE(ptrWords.Lookup(&x, w));
-    EXPECT_EQ(7, w);
-
-    CMapStringToOb obs;
-    CItem item(3);
-    obs[L"item"] = &item;
-    CObject* pOb = NULL;
-    EXPECT_TRUE(obs.Lookup(L"item", pOb));
-    EXPECT_EQ(&item, pOb);
+    WORD word = 0;
+    EXPECT_TRUE(ptrWords.Lookup(&x, word));
+    EXPECT_EQ(7, word);
+    CStringList list;
+    list.AddTail(L"x");
+    list.AddHead(L"w");
+    EXPECT_EQ(L"x", W(list.GetAt(list.Find(L"x"))));
+    EXPECT_EQ(nullptr, list.Find(L"z"));
+    CStringArray strings;
+    strings.Add(L"b");
+    strings.InsertAt(0, L"a");
+    strings.SetAtGrow(3, L"d");
+    CStringArray copy;
+    copy.Copy(strings);
+    strings[0] = L"changed";
+    EXPECT_EQ(L"a", W(copy[0]));
+    EXPECT_EQ(L"", W(copy[2]));
 }

@@ -7,6 +7,7 @@
 // - auto-deleting vs. the pre-allocated memory exception; error messages
 #include <gtest/gtest.h>
 #include <afx.h>
+#include <functional>
 #include <string>
 
 namespace {
@@ -170,81 +171,55 @@ TEST(Exceptions, ThrowLastPassesTheSameObjectOn)
 
 TEST(Exceptions, MemoryExceptionIsPreallocatedOthersAutoDelete)
 {
-    CMemoryException* pFirst = NULL;
-    CMemoryException* pSecond = NULL;
-    try
+    CException* pCaught[3] = {};
+    const std::function<void()> throws[] = { [] { AfxThrowMemoryException(); }, [] { AfxThrowMemoryException(); },
+                                             [] { AfxThrowNotSupportedException(); } };
+    for (int i = 0; i < 3; ++i)
     {
-        AfxThrowMemoryException();
+        try
+        {
+            throws[i]();
+        }
+        catch (CException* e)
+        {
+            pCaught[i] = e;
+            EXPECT_EQ(i == 2, e->m_bAutoDelete != FALSE) << i;
+            e->Delete();   // does nothing to the static memory exception
+        }
     }
-    catch (CMemoryException* e)
-    {
-        pFirst = e;
-        e->Delete();   // does nothing: the object is static
-    }
-    try
-    {
-        AfxThrowMemoryException();
-    }
-    catch (CMemoryException* e)
-    {
-        pSecond = e;
-        e->Delete();
-    }
-    ASSERT_NE(nullptr, pFirst);
-    EXPECT_EQ(pFirst, pSecond);
-    EXPECT_FALSE(pFirst->m_bAutoDelete);
-
+    ASSERT_NE(nullptr, pCaught[0]);
+    EXPECT_EQ(pCaught[0], pCaught[1]);
+    EXPECT_TRUE(pCaught[0]->IsKindOf(RUNTIME_CLASS(CMemoryException)));
     TCHAR szMessage[128];
-    EXPECT_TRUE(pFirst->GetErrorMessage(szMessage, 128));
+    EXPECT_TRUE(pCaught[0]->GetErrorMessage(szMessage, 128));
     EXPECT_NE(0, szMessage[0]);
-    EXPECT_TRUE(pFirst->GetErrorMessage(szMessage, 4)) << "truncates into a short buffer";
+    EXPECT_TRUE(pCaught[0]->GetErrorMessage(szMessage, 4)) << "truncates into a short buffer";
     EXPECT_EQ(3u, wcslen(szMessage));
-
-    bool caught = false;
-    try
-    {
-        AfxThrowNotSupportedException();
-    }
-    catch (CException* e)
-    {
-        caught = e->IsKindOf(RUNTIME_CLASS(CNotSupportedException)) && e->m_bAutoDelete;
-        e->Delete();
-    }
-    EXPECT_TRUE(caught);
-    try
-    {
-        AfxThrowResourceException();
-    }
-    catch (CResourceException* e)
-    {
-        EXPECT_TRUE(e->IsKindOf(RUNTIME_CLASS(CSimpleException)));
-        e->Delete();
-    }
 }
 
 TEST(Exceptions, FileExceptionCausesFromOsErrors)
 {
-    EXPECT_EQ(CFileException::none, CFileException::OsErrorToException(NO_ERROR));
-    EXPECT_EQ(CFileException::fileNotFound, CFileException::OsErrorToException(ERROR_FILE_NOT_FOUND));
-    EXPECT_EQ(CFileException::badPath, CFileException::OsErrorToException(ERROR_PATH_NOT_FOUND));
-    EXPECT_EQ(CFileException::accessDenied, CFileException::OsErrorToException(ERROR_ACCESS_DENIED));
-    EXPECT_EQ(CFileException::sharingViolation, CFileException::OsErrorToException(ERROR_SHARING_VIOLATION));
-    EXPECT_EQ(CFileException::diskFull, CFileException::OsErrorToException(ERROR_DISK_FULL));
-    EXPECT_EQ(CFileException::endOfFile, CFileException::OsErrorToException(ERROR_HANDLE_EOF));
-    EXPECT_EQ(CFileException::genericException, CFileException::OsErrorToException(123456));
-
-    CString name;
-    int cause = -1;
+    const struct { LONG error; int cause; } cases[] = {
+        { NO_ERROR, CFileException::none },
+        { ERROR_FILE_NOT_FOUND, CFileException::fileNotFound },
+        { ERROR_PATH_NOT_FOUND, CFileException::badPath },
+        { ERROR_ACCESS_DENIED, CFileException::accessDenied },
+        { ERROR_SHARING_VIOLATION, CFileException::sharingViolation },
+        { ERROR_DISK_FULL, CFileException::diskFull },
+        { ERROR_HANDLE_EOF, CFileException::endOfFile },
+        { 123456, CFileException::genericException },
+    };
+    for (const auto& c : cases)
+        EXPECT_EQ(c.cause, CFileException::OsErrorToException(c.error)) << "error " << c.error;
     try
     {
         CFileException::ThrowOsError(ERROR_TOO_MANY_OPEN_FILES, L"f.txt");
+        ADD_FAILURE() << "nothing thrown";
     }
     catch (CFileException* e)
     {
-        cause = e->m_cause;
-        name = e->m_strFileName;
+        EXPECT_EQ(CFileException::tooManyOpenFiles, e->m_cause);
+        EXPECT_EQ(std::wstring(L"f.txt"), std::wstring((LPCTSTR)e->m_strFileName));
         e->Delete();
     }
-    EXPECT_EQ(CFileException::tooManyOpenFiles, cause);
-    EXPECT_EQ(std::wstring(L"f.txt"), std::wstring((LPCTSTR)name));
 }

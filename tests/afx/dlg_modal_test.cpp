@@ -5,8 +5,8 @@
 //   it with that result, the owner is disabled meanwhile and enabled after
 // - PreTranslateMessage order inside the modal loop: control, its parent, the
 //   dialog (whose IsDialogMessage then handles the key)
-// - temporary objects made inside the modal loop are freed when it goes idle;
-//   those made before it survive
+// - temporary objects live through the modal loop (as in MFC, only the thread's
+//   idle time frees them), those made inside it and those made before
 // - OnOK with DDX_Text: invalid input keeps the dialog open with a message box,
 //   valid input ends it with IDOK and the value
 // - EndDialog from OnInitDialog ends DoModal at once
@@ -15,23 +15,23 @@
 #include <gtest/gtest.h>
 
 #include "Input.h"
-#include "dlg_template_test.h"
+#include "DialogTemplate.h"
 
 #include <string>
 
-using afx_test::DialogTemplate;
+using orvane_test::DialogTemplate;
 
 namespace {
 
 const WORD kEditId = 1001;
 const UINT kEndMsg = WM_USER + 5;
 
-DialogTemplate MakeTemplate(DWORD style = WS_POPUP | WS_CAPTION | WS_SYSMENU)
+DialogTemplate MakeTemplate()
 {
-    DialogTemplate tmpl(style, 160, 80, L"Test dialog");
-    tmpl.AddControl(DialogTemplate::Edit, WS_BORDER | WS_TABSTOP | ES_AUTOHSCROLL, 10, 10, 100, 14, kEditId, L"");
-    tmpl.AddControl(DialogTemplate::Button, BS_DEFPUSHBUTTON | WS_TABSTOP, 10, 40, 50, 14, IDOK, L"OK");
-    tmpl.AddControl(DialogTemplate::Button, BS_PUSHBUTTON | WS_TABSTOP, 70, 40, 50, 14, IDCANCEL, L"Cancel");
+    DialogTemplate tmpl(L"Test dialog", 160, 80, WS_POPUP | WS_CAPTION | WS_SYSMENU);
+    tmpl.AddItem(kEditId, DialogTemplate::Edit, L"", 10, 10, 100, 14, WS_BORDER | WS_TABSTOP | ES_AUTOHSCROLL);
+    tmpl.AddItem(IDOK, DialogTemplate::Button, L"OK", 10, 40, 50, 14, BS_DEFPUSHBUTTON | WS_TABSTOP);
+    tmpl.AddItem(IDCANCEL, DialogTemplate::Button, L"Cancel", 70, 40, 50, 14, BS_PUSHBUTTON | WS_TABSTOP);
     return tmpl;
 }
 
@@ -58,7 +58,7 @@ TEST(DlgModeless, SubclassDlgItemFromInMemoryTemplate)
 {
     DialogTemplate tmpl = MakeTemplate();
     CDialog dlg;
-    ASSERT_TRUE(dlg.CreateIndirect(tmpl.get()));
+    ASSERT_TRUE(dlg.CreateIndirect(tmpl.Get()));
     ASSERT_NE(nullptr, dlg.m_hWnd);
     EXPECT_EQ(&dlg, CWnd::FromHandlePermanent(dlg.m_hWnd));
 
@@ -215,7 +215,7 @@ using DlgModal = ModalFixture;
 TEST_F(DlgModal, EndDialogFromPostedMessageEndsTheLoopWithItsResult)
 {
     CModalDlg dlg(&owner);
-    ASSERT_TRUE(dlg.InitModalIndirect(tmpl.get(), &owner));
+    ASSERT_TRUE(dlg.InitModalIndirect(tmpl.Get(), &owner));
     EXPECT_EQ(77, dlg.DoModal());
     EXPECT_EQ(NULL, dlg.m_hWnd);
     EXPECT_EQ(owner.m_hWnd, dlg.m_hWndOwnerSeen);
@@ -228,7 +228,7 @@ TEST_F(DlgModal, EndDialogFromTimerEndsTheLoop)
     CModalDlg dlg(&owner);
     dlg.m_nTimerMs = 20;
     dlg.m_nEndResult = IDCANCEL;
-    ASSERT_TRUE(dlg.InitModalIndirect(tmpl.get(), &owner));
+    ASSERT_TRUE(dlg.InitModalIndirect(tmpl.Get(), &owner));
     EXPECT_EQ(IDCANCEL, dlg.DoModal());
     EXPECT_TRUE(owner.IsWindowEnabled());
 }
@@ -237,7 +237,7 @@ TEST_F(DlgModal, EndDialogInOnInitDialogEndsAtOnce)
 {
     CModalDlg dlg(&owner);
     dlg.m_bEndInInit = TRUE;
-    ASSERT_TRUE(dlg.InitModalIndirect(tmpl.get(), &owner));
+    ASSERT_TRUE(dlg.InitModalIndirect(tmpl.Get(), &owner));
     EXPECT_EQ(5, dlg.DoModal());
     EXPECT_EQ(NULL, dlg.m_hWnd);
     EXPECT_TRUE(owner.IsWindowEnabled());
@@ -257,14 +257,14 @@ TEST_F(DlgModal, PreTranslateMessageWalksControlParentDialog)
     CModalDlg dlg(&owner);
     dlg.m_bPanel = TRUE;
     dlg.m_nTimerMs = 30;
-    ASSERT_TRUE(dlg.InitModalIndirect(tmpl.get(), &owner));
+    ASSERT_TRUE(dlg.InitModalIndirect(tmpl.Get(), &owner));
     EXPECT_EQ(77, dlg.DoModal());
     EXPECT_EQ("child;parent;top;", dlg.m_trace);
     // the dialog manager dispatched the key after the walk
     EXPECT_EQ(1, dlg.m_panelEdit.m_nKeyDowns);
 }
 
-TEST_F(DlgModal, TemporariesMadeInsideTheLoopAreFreedAtIdle)
+TEST_F(DlgModal, TemporariesLiveThroughTheModalLoop)
 {
     HWND hOuter = ::CreateWindowExW(0, L"STATIC", L"o", WS_POPUP, 0, 0, 5, 5, NULL, NULL, NULL, NULL);
     HWND hInner = ::CreateWindowExW(0, L"STATIC", L"i", WS_POPUP, 0, 0, 5, 5, NULL, NULL, NULL, NULL);
@@ -275,9 +275,9 @@ TEST_F(DlgModal, TemporariesMadeInsideTheLoopAreFreedAtIdle)
     dlg.m_hWndTempInner = hInner;
     dlg.m_hWndTempOuter = hOuter;
     dlg.m_nTimerMs = 60;
-    ASSERT_TRUE(dlg.InitModalIndirect(tmpl.get(), &owner));
+    ASSERT_TRUE(dlg.InitModalIndirect(tmpl.Get(), &owner));
     EXPECT_EQ(77, dlg.DoModal());
-    EXPECT_EQ(0u, dlg.m_nInnerFlagsAtTimer);        // freed and made anew
+    EXPECT_EQ(0x4000u, dlg.m_nInnerFlagsAtTimer);   // not freed while the loop idled
     EXPECT_EQ(0x4000u, dlg.m_nOuterFlagsAtTimer);   // kept for this frame
     EXPECT_EQ(0x4000u, pOuter->m_nFlags);
     ::DestroyWindow(hOuter);
@@ -326,7 +326,7 @@ TEST_F(DlgModal, OnOkValidatesWithDataExchange)
         return seen.caption == appName ? IDOK : 0;
     });
     CDataDlg dlg;
-    ASSERT_TRUE(dlg.InitModalIndirect(tmpl.get(), &owner));
+    ASSERT_TRUE(dlg.InitModalIndirect(tmpl.Get(), &owner));
     EXPECT_EQ(IDOK, dlg.DoModal());
     EXPECT_STREQ(L"12", (LPCTSTR)dlg.m_strTyped);   // UpdateData(FALSE) in OnInitDialog
     EXPECT_EQ(-345, dlg.m_nValue);

@@ -1,7 +1,6 @@
 // CColorDialog (afxdlgs.h):
 //  - construction: the CHOOSECOLOR record MFC fills (size, hook, flags, RGB init only for
 //    a non-black colour, the shared custom colours);
-//  - DoModal answered OK with a colour typed into the dialog, and cancelled;
 //  - the dialog window is attached to the object while it runs: OnInitDialog of a derived
 //    class runs once with the window, OnOK is routed through the object, and the object
 //    lets go of the window afterwards;
@@ -13,60 +12,14 @@
 
 #include <commctrl.h>
 
+#include "Input.h"
+
 #include <functional>
 #include <vector>
 
 namespace {
 
-// Runs one step per timer tick against the active dialog of this thread, while any
-// modal loop runs; steps return false to be retried. Cancels everything after 5 s.
-class DialogSteps
-{
-public:
-    using Step = std::function<bool(HWND)>;
-    explicit DialogSteps(std::vector<Step> steps) : m_steps(std::move(steps)), m_start(::GetTickCount())
-    {
-        s_current = this;
-        m_timer = ::SetTimer(NULL, 0, 15, Tick);
-    }
-    ~DialogSteps()
-    {
-        ::KillTimer(NULL, m_timer);
-        s_current = nullptr;
-    }
-    bool finished() const { return m_next == m_steps.size(); }
-
-private:
-    static void CALLBACK Tick(HWND, UINT, UINT_PTR, DWORD)
-    {
-        DialogSteps* self = s_current;
-        if (self == nullptr || self->m_busy || self->finished())
-            return;
-        self->m_busy = true;
-        HWND hActive = ::GetActiveWindow();
-        wchar_t cls[16] = {};
-        ::GetClassNameW(hActive, cls, 16);
-        if (::GetTickCount() - self->m_start > 5000)
-        {
-            ::PostMessage(hActive, WM_COMMAND, IDCANCEL, 0);
-            self->m_next = self->m_steps.size() + 1;
-        }
-        else if (lstrcmpW(cls, L"#32770") == 0 && ::IsWindowVisible(hActive) && self->m_steps[self->m_next](hActive))
-        {
-            ++self->m_next;
-        }
-        self->m_busy = false;
-    }
-
-    static DialogSteps* s_current;
-    std::vector<Step> m_steps;
-    size_t m_next = 0;
-    DWORD m_start;
-    UINT_PTR m_timer = 0;
-    bool m_busy = false;
-};
-
-DialogSteps* DialogSteps::s_current = nullptr;
+using DialogSteps = orvane_test::ModalScript;
 
 bool TypeColourAndOk(HWND hDlg, int r, int g, int b)
 {
@@ -96,28 +49,6 @@ TEST(CColorDialogTest, ConstructionFillsTheRecord)
     COLORREF* pCustom = CColorDialog::GetSavedCustomColors();
     ASSERT_NE(nullptr, pCustom);
     EXPECT_EQ(pCustom, CColorDialog::GetSavedCustomColors());
-}
-
-TEST(CColorDialogTest, OkReturnsTheTypedColour)
-{
-    CColorDialog dlg(RGB(1, 2, 3), CC_FULLOPEN);
-    DialogSteps steps({ [](HWND h) { return TypeColourAndOk(h, 10, 20, 30); } });
-    EXPECT_EQ(IDOK, dlg.DoModal());
-    EXPECT_TRUE(steps.finished());
-    EXPECT_EQ(RGB(10, 20, 30), dlg.GetColor());
-    EXPECT_EQ(nullptr, dlg.m_hWnd);
-}
-
-TEST(CColorDialogTest, CancelReturnsIdCancelAndKeepsTheColour)
-{
-    CColorDialog dlg(RGB(1, 2, 3));
-    DialogSteps steps({ [](HWND h) {
-        ::PostMessage(h, WM_COMMAND, IDCANCEL, 0);
-        return true;
-    } });
-    EXPECT_EQ(IDCANCEL, dlg.DoModal());
-    EXPECT_TRUE(steps.finished());
-    EXPECT_EQ(RGB(1, 2, 3), dlg.GetColor());
 }
 
 // A derived dialog that records what reaches the object.
@@ -158,6 +89,7 @@ public:
     std::vector<COLORREF> m_colorsAtColorOk;
 };
 
+// DoModal answered OK with a typed colour and cancelled is KVXColorDialog's test too (buttons).
 TEST(CColorDialogTest, TheObjectGetsTheDialogsMessages)
 {
     CRecordingColorDialog dlg;

@@ -84,17 +84,14 @@ const HitCase kHitCases[] = {
     { "FarOutside", 5000, 5000, -1, -1 },
 };
 
-class ColorGridHit : public ::testing::TestWithParam<HitCase> {};
-
-TEST_P(ColorGridHit, HoverAndRelease)
+TEST(ColorGridHit, HoverAndRelease)
 {
-    const HitCase& c = GetParam();
-    EXPECT_EQ(c.hover, ColorGridGeometry::CellFromHoverPoint(Spaced(), c.x, c.y));
-    EXPECT_EQ(c.release, ColorGridGeometry::CellFromReleasePoint(Spaced(), c.x, c.y));
+    for (const HitCase& c : kHitCases)
+    {
+        EXPECT_EQ(c.hover, ColorGridGeometry::CellFromHoverPoint(Spaced(), c.x, c.y)) << c.name;
+        EXPECT_EQ(c.release, ColorGridGeometry::CellFromReleasePoint(Spaced(), c.x, c.y)) << c.name;
+    }
 }
-
-INSTANTIATE_TEST_SUITE_P(Cases, ColorGridHit, ::testing::ValuesIn(kHitCases),
-                         [](const ::testing::TestParamInfo<HitCase>& info) { return std::string(info.param.name); });
 
 TEST(ColorGridCells, DefaultGridRow1Column2IsWhite)
 {
@@ -148,18 +145,15 @@ const PlaceCase kPlaceCases[] = {
     { "NegativeBecomesZero", { -20, -7 }, { 0, 0 } },
 };
 
-class ColorPopupPlacement : public ::testing::TestWithParam<PlaceCase> {};
-
-TEST_P(ColorPopupPlacement, KeepsInside)
+TEST(ColorPopupPlacement, KeepsInside)
 {
-    const PlaceCase& c = GetParam();
-    POINT pt = ColorGridGeometry::KeepPopupInside(c.origin, kPopup, kScreen);
-    EXPECT_EQ(c.expected.x, pt.x);
-    EXPECT_EQ(c.expected.y, pt.y);
+    for (const PlaceCase& c : kPlaceCases)
+    {
+        const POINT pt = ColorGridGeometry::KeepPopupInside(c.origin, kPopup, kScreen);
+        EXPECT_EQ(c.expected.x, pt.x) << c.name;
+        EXPECT_EQ(c.expected.y, pt.y) << c.name;
+    }
 }
-
-INSTANTIATE_TEST_SUITE_P(Cases, ColorPopupPlacement, ::testing::ValuesIn(kPlaceCases),
-                         [](const ::testing::TestParamInfo<PlaceCase>& info) { return std::string(info.param.name); });
 
 TEST(ColorPopupGeometry, PopupTallerThanScreenSticksToTop)
 {
@@ -203,18 +197,15 @@ const KeyCase kKeyCases[] = {
     { "DownFromOtherToFirst", VK_DOWN, -1, false, 0 },
 };
 
-class ColorPopupKeys : public ::testing::TestWithParam<KeyCase> {};
-
-TEST_P(ColorPopupKeys, MovesHover)
+TEST(ColorPopupKeys, MovesHover)
 {
-    const KeyCase& c = GetParam();
-    int hover = 12345;
-    ASSERT_TRUE(ColorGridGeometry::MoveHoverByKey(ColorGridLayout(), c.hover, c.vk, c.other, hover));
-    EXPECT_EQ(c.expected, hover);
+    for (const KeyCase& c : kKeyCases)
+    {
+        int hover = 12345;
+        ASSERT_TRUE(ColorGridGeometry::MoveHoverByKey(ColorGridLayout(), c.hover, c.vk, c.other, hover)) << c.name;
+        EXPECT_EQ(c.expected, hover) << c.name;
+    }
 }
-
-INSTANTIATE_TEST_SUITE_P(Cases, ColorPopupKeys, ::testing::ValuesIn(kKeyCases),
-                         [](const ::testing::TestParamInfo<KeyCase>& info) { return std::string(info.param.name); });
 
 TEST(ColorPopupKeysOther, OtherKeysAreNotMoves)
 {
@@ -226,18 +217,18 @@ TEST(ColorPopupKeysOther, OtherKeysAreNotMoves)
 
 TEST(ColorPopupSettings, Ranges)
 {
-    EXPECT_FALSE(ColorGridGeometry::IsValidGridCount(0));
-    EXPECT_TRUE(ColorGridGeometry::IsValidGridCount(1));
-    EXPECT_TRUE(ColorGridGeometry::IsValidGridCount(20));
-    EXPECT_FALSE(ColorGridGeometry::IsValidGridCount(21));
-    EXPECT_FALSE(ColorGridGeometry::IsValidButtonExtent(9));
-    EXPECT_TRUE(ColorGridGeometry::IsValidButtonExtent(10));
-    EXPECT_TRUE(ColorGridGeometry::IsValidButtonExtent(100));
-    EXPECT_FALSE(ColorGridGeometry::IsValidButtonExtent(101));
-    EXPECT_FALSE(ColorGridGeometry::IsValidGridSpacing(-1));
-    EXPECT_TRUE(ColorGridGeometry::IsValidGridSpacing(0));
-    EXPECT_TRUE(ColorGridGeometry::IsValidGridSpacing(100));
-    EXPECT_FALSE(ColorGridGeometry::IsValidGridSpacing(101));
+    for (long n : { 0L, 21L })
+        EXPECT_FALSE(ColorGridGeometry::IsValidGridCount(n)) << n;
+    for (long n : { 1L, 20L })
+        EXPECT_TRUE(ColorGridGeometry::IsValidGridCount(n)) << n;
+    for (long n : { 9L, 101L })
+        EXPECT_FALSE(ColorGridGeometry::IsValidButtonExtent(n)) << n;
+    for (long n : { 10L, 100L })
+        EXPECT_TRUE(ColorGridGeometry::IsValidButtonExtent(n)) << n;
+    for (long n : { -1L, 101L })
+        EXPECT_FALSE(ColorGridGeometry::IsValidGridSpacing(n)) << n;
+    for (long n : { 0L, 100L })
+        EXPECT_TRUE(ColorGridGeometry::IsValidGridSpacing(n)) << n;
 }
 
 // ---------------------------------------------------------------------------
@@ -285,22 +276,19 @@ const LookCase kLookCases[] = {
       { { kMagenta, kFace }, { 0x808080, kHi }, { 0x000000, kSh } } },
 };
 
-class BitmapButtonLook : public ::testing::TestWithParam<LookCase> {};
-
-TEST_P(BitmapButtonLook, BitmapAndMap)
+TEST(BitmapButtonLook, BitmapAndMap)
 {
-    const LookCase& c = GetParam();
-    ButtonLook::Look look = ButtonLook::Choose(c.kind, c.pressed, c.enabled, c.normal, c.pressedBitmap,
-                                               c.disabled, c.key, kColors);
-    EXPECT_EQ(c.bitmap, look.bitmap);
-    std::vector<std::pair<COLORREF, COLORREF>> map;
-    for (int i = 0; i < look.mapCount; ++i)
-        map.emplace_back(look.map[i].from, look.map[i].to);
-    EXPECT_EQ(c.map, map);
+    for (const LookCase& c : kLookCases)
+    {
+        const ButtonLook::Look look = ButtonLook::Choose(c.kind, c.pressed, c.enabled, c.normal, c.pressedBitmap,
+                                                         c.disabled, c.key, kColors);
+        EXPECT_EQ(c.bitmap, look.bitmap) << c.name;
+        std::vector<std::pair<COLORREF, COLORREF>> map;
+        for (int i = 0; i < look.mapCount; ++i)
+            map.emplace_back(look.map[i].from, look.map[i].to);
+        EXPECT_EQ(c.map, map) << c.name;
+    }
 }
-
-INSTANTIATE_TEST_SUITE_P(Cases, BitmapButtonLook, ::testing::ValuesIn(kLookCases),
-                         [](const ::testing::TestParamInfo<LookCase>& info) { return std::string(info.param.name); });
 
 TEST(BitmapButtonLookCentre, IntegerDivision)
 {

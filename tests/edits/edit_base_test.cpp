@@ -2,25 +2,23 @@
 // typeable syntax error) inside modeless dialogs:
 //  - the character filter, and Ctrl+C/V/X passing it only while Ctrl is down;
 //  - the change check registering and unregistering, the parent still getting EN_CHANGE,
-//    an emptied field being valid;
-//  - Tab and Alt swallowed while an error is pending, focus moves to another control of
-//    the same dialog bringing up the message, the selection from the error position;
-//  - focus moves in another dialog ignored; two invalid edits in one dialog;
-//  - SetOwnMessage shown once; a disabled invalid field restored without a box;
-//  - GetModified after a commit, undefined mode;
+//    an emptied field being valid, the later of two invalid edits registered;
+//  - Tab, Alt keys and focus moves within the page held while an error is pending (the
+//    message shown, the focus taken back, the text from the error position selected);
+//    focus moves in another dialog ignored; SetOwnMessage shown once;
+//  - a disabled invalid field restored without a box; GetModified, undefined mode;
 //  - mended faults: no registration outlives its edit or its window, unbalanced
-//    InitErrorHandling calls, another page's edits not taking the hooks along, the box
-//    taking the focus, a second display request while the box is up.
+//    InitErrorHandling calls, another page's edits not taking the hooks along, a second
+//    display request while the box is up.
 #include "edit_harness.h"
 
 #include "KVXEdit.h"
-
-#include <cwctype>
 
 namespace {
 
 using namespace edit_test;
 using orvane_test::KeyStateGuard;
+using orvane_test::PostKey;
 using orvane_test::SendChars;
 
 class ProbeEdit : public KVXEdit
@@ -28,7 +26,7 @@ class ProbeEdit : public KVXEdit
 public:
     int charChecks = 0;
 
-    virtual int SetValueAsVariant(KVXVariant varValue, int bCommit)
+    int SetValueAsVariant(KVXVariant varValue, int bCommit) override
     {
         long value = 0;
         if (varValue.GetAs(value, 1) != KVT_VARIANT_OK)
@@ -44,48 +42,45 @@ public:
             CString text;
             text.Format(_T("%ld"), value);
             SetWindowText(text);
-            SendMessage(EM_SETSEL, 100, 101);
+            SetSel(100, 101);   // caret at the end, where typing continues
         }
         return TRUE;
     }
-
-    virtual int SyntaxCheck(int bShow) { return KVXEdit::SyntaxCheck(bShow); }
+    int SyntaxCheck(int bShow) override { return KVXEdit::SyntaxCheck(bShow); }
 
     long Value() const { return AsLong(m_varValue); }
     long Committed() const { return AsLong(m_varCommitted); }
-    std::string Message() const { return Narrow((LPCTSTR)m_strErrorMessage); }
+    std::string Message() const { return Narrow(static_cast<LPCTSTR>(m_strErrorMessage)); }
     int ErrorPos() const { return m_nErrorPos; }
+    std::string Text() const { return Narrow(WindowText(m_hWnd)); }
     KVXVariant ReadValue(int commit) { return GetValueAsVariant(commit); }
-
     static int PagesCount() { return m_iErrorPagesCount; }
     static bool HooksInstalled() { return m_hHookGet != NULL && m_hHookRet != NULL; }
     static bool HooksRemoved() { return m_hHookGet == NULL && m_hHookRet == NULL; }
 
 protected:
-    virtual int CharCheck(WCHAR c)
+    int CharCheck(WCHAR c) override
     {
         ++charChecks;
         return c == 8 || c == L'x' || (c >= L'0' && c <= L'9');
     }
-
-    virtual int SyntaxCheck(KVXString strText)
+    int SyntaxCheck(KVXString strText) override
     {
-        if (strText.IsEmpty())
-        {
-            CString message(_T("Empty"));
-            SetErrorMessage(message);
-            return FALSE;
-        }
+        CString message(_T("Empty"));
         for (int i = 0; i < strText.GetLength(); ++i)
         {
             if (strText[i] < L'0' || strText[i] > L'9')
             {
                 SetErrorPos(i);
-                CString message;
                 message.Format(_T("Bad character at %d"), i);
                 SetErrorMessage(message);
                 return FALSE;
             }
+        }
+        if (strText.IsEmpty())
+        {
+            SetErrorMessage(message);
+            return FALSE;
         }
         m_varValue = static_cast<long>(_wtol(strText));
         return TRUE;
@@ -100,49 +95,21 @@ private:
     }
 };
 
-void PutClipboardText(HWND owner, const wchar_t* text)
-{
-    ASSERT_TRUE(::OpenClipboard(owner));
-    ::EmptyClipboard();
-    const size_t bytes = (wcslen(text) + 1) * sizeof(wchar_t);
-    HGLOBAL memory = ::GlobalAlloc(GMEM_MOVEABLE, bytes);
-    memcpy(::GlobalLock(memory), text, bytes);
-    ::GlobalUnlock(memory);
-    ::SetClipboardData(CF_UNICODETEXT, memory);
-    ::CloseClipboard();
-}
-
-std::string ClipboardText(HWND owner)
-{
-    std::string text = "<none>";
-    if (!::OpenClipboard(owner))
-        return "<locked>";
-    if (HANDLE data = ::GetClipboardData(CF_UNICODETEXT))
-    {
-        text = Narrow(static_cast<const wchar_t*>(::GlobalLock(data)));
-        ::GlobalUnlock(data);
-    }
-    ::CloseClipboard();
-    return text;
-}
-
 class EditBase : public testing::Test
 {
 protected:
-    static void SetUpTestSuite() { EnsureLibraryLoaded(); }
+    static void SetUpTestSuite() { orvane_test::LoadLibraryOnce(); }
 
     void SetUp() override
     {
         ASSERT_TRUE(dlg.Open());
         ASSERT_TRUE(edit1.SubclassDlgItem(kIdEdit1, &dlg));
         ASSERT_TRUE(edit2.SubclassDlgItem(kIdEdit2, &dlg));
-        // As a host page does when it starts.
-        edit1.InitErrorHandling(dlg.m_hWnd, TRUE);
+        edit1.InitErrorHandling(dlg.m_hWnd, TRUE);   // as a host page does when it starts
         edit1.SetFocus();
         PumpDialog(dlg);
         dlg.changes.clear();
     }
-
     void TearDown() override
     {
         edit1.InitErrorHandling(dlg.m_hWnd, FALSE);
@@ -150,12 +117,18 @@ protected:
         PumpDialog(NULL);
     }
 
-    // Types text into edit1 and leaves it invalid at position 2 ("12x45").
+    // Types into edit1 and leaves it invalid at position 2 ("12x45").
     void MakeEdit1Invalid()
     {
         edit1.SetFocus();
         SendChars(edit1, L"12x45");
         ASSERT_EQ(&edit1, KVXEdit::FindErrorOnPage(dlg));
+    }
+    // Tab in edit1, as a user presses it; with the page's hooks a pending error holds it.
+    void Tab()
+    {
+        PostKey(edit1, VK_TAB);
+        PumpDialog(dlg);
     }
 
     TestDialog dlg;
@@ -163,124 +136,114 @@ protected:
     ProbeEdit edit2;
 };
 
-TEST_F(EditBase, TypedCharactersPassTheFilter)
+TEST_F(EditBase, TypedCharactersPassTheFilterClipboardKeysOnlyWithCtrl)
 {
     SendChars(edit1, L"1a2 3x");
-    EXPECT_EQ("123x", Narrow(WindowText(edit1)));
+    EXPECT_EQ("123x", edit1.Text());
     EXPECT_EQ(6, edit1.charChecks);
-}
 
-TEST_F(EditBase, ClipboardKeysBypassTheFilterOnlyWhileCtrlIsDown)
-{
-    PutClipboardText(dlg, L"45");
+    ASSERT_TRUE(orvane_test::SetClipboardText(dlg, L"45"));
+    edit1.SetWindowText(_T(""));
     ::SendMessageW(edit1, WM_CHAR, 22, 1);   // Ctrl+V's code without Ctrl: the filter refuses it
-    EXPECT_EQ("", Narrow(WindowText(edit1)));
-    EXPECT_EQ(1, edit1.charChecks);
-
+    EXPECT_EQ("", edit1.Text());
+    EXPECT_EQ(7, edit1.charChecks);
     {
         KeyStateGuard ctrl({ VK_CONTROL });
         ::SendMessageW(edit1, WM_CHAR, 22, 1);
-        EXPECT_EQ("45", Narrow(WindowText(edit1)));
-
-        PutClipboardText(dlg, L"zz");
+        EXPECT_EQ("45", edit1.Text());
+        orvane_test::SetClipboardText(dlg, L"zz");
         ::SendMessageW(edit1, EM_SETSEL, 0, -1);
         ::SendMessageW(edit1, WM_CHAR, 3, 1);
-        EXPECT_EQ("45", ClipboardText(dlg));
-
-        PutClipboardText(dlg, L"zz");
+        EXPECT_EQ(L"45", orvane_test::ClipboardText(dlg));
+        orvane_test::SetClipboardText(dlg, L"zz");
         ::SendMessageW(edit1, WM_CHAR, 24, 1);
-        EXPECT_EQ("45", ClipboardText(dlg));
-        EXPECT_EQ("", Narrow(WindowText(edit1)));
+        EXPECT_EQ(L"45", orvane_test::ClipboardText(dlg));
+        EXPECT_EQ("", edit1.Text());
     }
-    EXPECT_EQ(1, edit1.charChecks);
+    EXPECT_EQ(7, edit1.charChecks);
 }
 
-TEST_F(EditBase, FailedCheckRegistersAndTheParentStillGetsEnChange)
+TEST_F(EditBase, FailedCheckRegistersTheParentStillGetsEnChangeAnEmptyFieldIsValid)
 {
     SendChars(edit1, L"12");
     EXPECT_EQ(nullptr, KVXEdit::FindErrorOnPage(dlg));
     EXPECT_EQ(12, edit1.Value());
-
     SendChars(edit1, L"x");
     EXPECT_EQ(&edit1, KVXEdit::FindErrorOnPage(dlg));
     EXPECT_EQ(12, edit1.Value());
     EXPECT_EQ("Bad character at 2", edit1.Message());
     EXPECT_EQ(2, edit1.ErrorPos());
-
     SendChars(edit1, L"\b");
     EXPECT_EQ(nullptr, KVXEdit::FindErrorOnPage(dlg));
+    EXPECT_EQ(std::vector<UINT>(4, kIdEdit1), dlg.changes);
 
-    const std::vector<UINT> expected(4, kIdEdit1);
-    EXPECT_EQ(expected, dlg.changes);
-}
-
-TEST_F(EditBase, AnEmptiedFieldIsValidAndKeepsTheLastValue)
-{
-    SendChars(edit1, L"34x");
-    ASSERT_EQ(&edit1, KVXEdit::FindErrorOnPage(dlg));
+    SendChars(edit1, L"4x");
     edit1.SetWindowText(_T(""));
     EXPECT_EQ(nullptr, KVXEdit::FindErrorOnPage(dlg));
     EXPECT_TRUE(edit1.SyntaxCheck(FALSE));
-    EXPECT_EQ(34, edit1.Value());
+    EXPECT_EQ(124, edit1.Value());
 }
 
-TEST_F(EditBase, TabInAnInvalidFieldIsSwallowedAndShowsTheMessage)
+TEST_F(EditBase, OnlyTheLaterOfTwoInvalidEditsIsRegistered)
+{
+    SendChars(edit1, L"1x");
+    SendChars(edit2, L"2x");
+    EXPECT_EQ(&edit2, KVXEdit::FindErrorOnPage(dlg));
+    SendChars(edit1, L"\b");
+    EXPECT_EQ(&edit2, KVXEdit::FindErrorOnPage(dlg));
+    SendChars(edit1, L"x");
+    SendChars(edit2, L"\b");
+    EXPECT_EQ(&edit1, KVXEdit::FindErrorOnPage(dlg));
+    SendChars(edit1, L"\b");
+    EXPECT_EQ(nullptr, KVXEdit::FindErrorOnPage(dlg));
+}
+
+// What a user does to leave an invalid field, and each is held the same way.
+struct LeaveCase
+{
+    const char* name;
+    void (*leave)(TestDialog& dlg, HWND edit);
+};
+
+const LeaveCase kLeaveCases[] = {
+    { "Tab", [](TestDialog& dlg, HWND edit) { PostKey(edit, VK_TAB); PumpDialog(dlg); } },
+    { "AltKey", [](TestDialog& dlg, HWND edit) { PostKey(edit, 'F', true); PumpDialog(dlg); } },
+    { "FocusToAnotherControl", [](TestDialog& dlg, HWND) { ::SetFocus(dlg.Item(kIdButton)); PumpDialog(dlg); } },
+};
+
+class EditBaseLeave : public EditBase, public testing::WithParamInterface<LeaveCase> {};
+
+TEST_P(EditBaseLeave, ShowsTheMessageAndTakesTheFocusBackEveryTime)
 {
     BoxRecorder boxes;
     MakeEdit1Invalid();
-    PostKey(edit1, VK_TAB);
-    PumpDialog(dlg);
-    EXPECT_EQ(1, boxes.count());
-    EXPECT_EQ("Bad character at 2", boxes.last());
-    EXPECT_EQ(edit1.m_hWnd, ::GetFocus());
-    EXPECT_EQ("2-5", Selection(edit1));
-    EXPECT_EQ("12x45", Narrow(WindowText(edit1)));   // the display changes no text
+    for (int attempt = 1; attempt <= 2; ++attempt)
+    {
+        GetParam().leave(dlg, edit1);
+        EXPECT_EQ(attempt, boxes.count());
+        EXPECT_EQ("Bad character at 2", boxes.last());
+        EXPECT_EQ(edit1.m_hWnd, ::GetFocus());
+        EXPECT_EQ("2-5", Selection(edit1));
+    }
+    EXPECT_EQ("12x45", edit1.Text());   // the display changes no text
+    EXPECT_EQ(&edit1, KVXEdit::FindErrorOnPage(dlg));
 }
+
+INSTANTIATE_TEST_SUITE_P(Cases, EditBaseLeave, testing::ValuesIn(kLeaveCases),
+    [](const testing::TestParamInfo<LeaveCase>& info) { return std::string(info.param.name); });
 
 TEST_F(EditBase, TabMovesOnWithoutAnErrorOrWithoutTheHooks)
 {
     BoxRecorder boxes;
     SendChars(edit1, L"12");
-    PostKey(edit1, VK_TAB);
-    PumpDialog(dlg);
+    Tab();
     EXPECT_EQ(edit2.m_hWnd, ::GetFocus());
-
-    // The page ends its error handling: an invalid field no longer holds the user.
-    edit1.InitErrorHandling(dlg.m_hWnd, FALSE);
+    edit1.InitErrorHandling(dlg.m_hWnd, FALSE);   // the page ends its error handling
     MakeEdit1Invalid();
-    PostKey(edit1, VK_TAB);
-    PumpDialog(dlg);
+    Tab();
     EXPECT_EQ(edit2.m_hWnd, ::GetFocus());
     EXPECT_EQ(0, boxes.count());
     edit1.InitErrorHandling(dlg.m_hWnd, TRUE);
-}
-
-TEST_F(EditBase, AltKeysAreSwallowedWhileAnErrorIsPending)
-{
-    BoxRecorder boxes;
-    MakeEdit1Invalid();
-    PostKey(edit1, 'F', true);
-    PumpDialog(dlg);
-    EXPECT_EQ(1, boxes.count());
-    EXPECT_EQ(edit1.m_hWnd, ::GetFocus());
-}
-
-TEST_F(EditBase, FocusMovingToAnotherControlShowsTheMessageEveryTime)
-{
-    BoxRecorder boxes;
-    MakeEdit1Invalid();
-    ::SetFocus(dlg.Item(kIdButton));
-    PumpDialog(dlg);
-    EXPECT_EQ(1, boxes.count());
-    EXPECT_EQ("Bad character at 2", boxes.last());
-    EXPECT_EQ(edit1.m_hWnd, ::GetFocus());
-    EXPECT_EQ("2-5", Selection(edit1));
-
-    ::SetFocus(dlg.Item(kIdButton));
-    PumpDialog(dlg);
-    EXPECT_EQ(2, boxes.count());
-    EXPECT_EQ(edit1.m_hWnd, ::GetFocus());
-    EXPECT_EQ(&edit1, KVXEdit::FindErrorOnPage(dlg));
 }
 
 TEST_F(EditBase, FocusMovesInAnotherDialogAreIgnored)
@@ -298,21 +261,7 @@ TEST_F(EditBase, FocusMovesInAnotherDialogAreIgnored)
     EXPECT_EQ(&edit1, KVXEdit::FindErrorOnPage(dlg));
 }
 
-TEST_F(EditBase, OnlyTheLaterOfTwoInvalidEditsIsRegistered)
-{
-    SendChars(edit1, L"1x");
-    SendChars(edit2, L"2x");
-    EXPECT_EQ(&edit2, KVXEdit::FindErrorOnPage(dlg));
-    SendChars(edit1, L"\b");
-    EXPECT_EQ(&edit2, KVXEdit::FindErrorOnPage(dlg));
-    SendChars(edit1, L"x");
-    SendChars(edit2, L"\b");
-    EXPECT_EQ(&edit1, KVXEdit::FindErrorOnPage(dlg));
-    SendChars(edit1, L"\b");
-    EXPECT_EQ(nullptr, KVXEdit::FindErrorOnPage(dlg));
-}
-
-TEST_F(EditBase, HostMessageIsShownOnce)
+TEST_F(EditBase, HostMessageIsShownOnceAlsoWhenTheFieldGetsTheFocus)
 {
     BoxRecorder boxes;
     SendChars(edit1, L"7");
@@ -327,17 +276,13 @@ TEST_F(EditBase, HostMessageIsShownOnce)
     EXPECT_FALSE(edit1.ShowErrorMessage());
     PumpDialog(dlg);
     EXPECT_EQ(1, boxes.count());
-}
 
-TEST_F(EditBase, HostMessageIsShownWhenTheFieldItselfGetsTheFocus)
-{
-    BoxRecorder boxes;
     edit2.SetFocus();
-    CString message(_T("Check this"));
-    edit1.SetOwnMessage(message);
+    CString check(_T("Check this"));
+    edit1.SetOwnMessage(check);
     edit1.SetFocus();
     PumpDialog(dlg);
-    EXPECT_EQ(1, boxes.count());
+    EXPECT_EQ(2, boxes.count());
     EXPECT_EQ("Check this", boxes.last());
 }
 
@@ -351,12 +296,12 @@ TEST_F(EditBase, DisabledInvalidFieldGetsItsCommittedValueWithoutABox)
     EXPECT_TRUE(edit1.ShowErrorMessage());
     PumpDialog(dlg);
     EXPECT_EQ(0, boxes.count());
-    EXPECT_EQ("5", Narrow(WindowText(edit1)));
+    EXPECT_EQ("5", edit1.Text());
     EXPECT_EQ(5, edit1.Value());
     EXPECT_EQ(nullptr, KVXEdit::FindErrorOnPage(dlg));
 }
 
-TEST_F(EditBase, ModifiedOnlyWhileTheValueDiffersFromTheCommittedOne)
+TEST_F(EditBase, ModifiedWhileTheValueDiffersUndefinedWhileEmpty)
 {
     edit1.SetValueAsVariant(KVXVariant(5L), TRUE);
     EXPECT_FALSE(edit1.GetModified());
@@ -365,21 +310,15 @@ TEST_F(EditBase, ModifiedOnlyWhileTheValueDiffersFromTheCommittedOne)
     SendChars(edit1, L"\b5");
     EXPECT_FALSE(edit1.GetModified());
     SendChars(edit1, L"\b7");
-    EXPECT_TRUE(edit1.GetModified());
-    KVXVariant read = edit1.ReadValue(TRUE);
     long value = 0;
-    read.GetAs(value, 1);
+    edit1.ReadValue(TRUE).GetAs(value, 1);
     EXPECT_EQ(7, value);
     EXPECT_FALSE(edit1.GetModified());
     EXPECT_EQ(7, edit1.Committed());
-}
 
-TEST_F(EditBase, UndefinedModeLastsWhileTheFieldIsEmpty)
-{
-    edit1.SetValueAsVariant(KVXVariant(5L), TRUE);
     SendChars(edit1, L"\b6");
     edit1.SetUndefined(TRUE);
-    EXPECT_EQ("", Narrow(WindowText(edit1)));
+    EXPECT_EQ("", edit1.Text());
     EXPECT_TRUE(edit1.GetUndefined());
     EXPECT_FALSE(edit1.GetModified());
     SendChars(edit1, L"3");
@@ -389,8 +328,7 @@ TEST_F(EditBase, UndefinedModeLastsWhileTheFieldIsEmpty)
 
 TEST_F(EditBase, FocusTrackingFollowsTheEdit)
 {
-    // The dialog gave edit1 the focus before it was subclassed: move it away first.
-    edit2.SetFocus();
+    edit2.SetFocus();   // the dialog gave edit1 the focus before it was subclassed
     edit1.SetFocus();
     EXPECT_TRUE(edit1.IsFocusSet());
     edit2.SetFocus();
@@ -400,7 +338,7 @@ TEST_F(EditBase, FocusTrackingFollowsTheEdit)
 
 // --- mended faults ----------------------------------------------------------
 
-TEST_F(EditBase, DestroyedEditTakesItsRegistrationAlong)
+TEST_F(EditBase, DestroyedEditTakesItsRegistrationAlongAndLeavesAnothersAlone)
 {
     BoxRecorder boxes;
     auto* edit3 = new ProbeEdit;
@@ -412,18 +350,14 @@ TEST_F(EditBase, DestroyedEditTakesItsRegistrationAlong)
     delete edit3;
     ASSERT_TRUE(::IsWindow(hEdit3));
     EXPECT_EQ(nullptr, KVXEdit::FindErrorOnPage(dlg));
-
     edit2.SetFocus();
     PostKey(edit2, VK_TAB);
     PumpDialog(dlg);
     EXPECT_EQ(0, boxes.count());
     EXPECT_NE(edit2.m_hWnd, ::GetFocus());
-}
 
-TEST_F(EditBase, DestroyedEditLeavesAnotherEditsRegistrationAlone)
-{
-    auto* edit3 = new ProbeEdit;
-    ASSERT_TRUE(edit3->SubclassDlgItem(kIdEdit3, &dlg));
+    edit3 = new ProbeEdit;
+    ASSERT_TRUE(edit3->SubclassWindow(hEdit3));
     SendChars(*edit3, L"x");
     SendChars(edit1, L"x");
     ASSERT_EQ(&edit1, KVXEdit::FindErrorOnPage(dlg));
@@ -451,20 +385,16 @@ TEST_F(EditBase, UnbalancedReleasesNeitherGoNegativeNorUnhookTwice)
 {
     ASSERT_EQ(1, ProbeEdit::PagesCount());
     ASSERT_TRUE(ProbeEdit::HooksInstalled());
-    edit1.InitErrorHandling(dlg.m_hWnd, FALSE);
-    edit1.InitErrorHandling(dlg.m_hWnd, FALSE);
-    edit1.InitErrorHandling(dlg.m_hWnd, FALSE);
+    for (int i = 0; i < 3; ++i)
+        edit1.InitErrorHandling(dlg.m_hWnd, FALSE);
     EXPECT_EQ(0, ProbeEdit::PagesCount());
     EXPECT_TRUE(ProbeEdit::HooksRemoved());
-
     // One start brings the hooks back: Tab is held again.
     BoxRecorder boxes;
     edit1.InitErrorHandling(dlg.m_hWnd, TRUE);
     EXPECT_EQ(1, ProbeEdit::PagesCount());
-    EXPECT_TRUE(ProbeEdit::HooksInstalled());
     MakeEdit1Invalid();
-    PostKey(edit1, VK_TAB);
-    PumpDialog(dlg);
+    Tab();
     EXPECT_EQ(1, boxes.count());
     EXPECT_EQ(edit1.m_hWnd, ::GetFocus());
 }
@@ -484,12 +414,10 @@ TEST_F(EditBase, AnotherPagesEditsDoNotTakeTheHooksAlong)
     }
     EXPECT_EQ(1, ProbeEdit::PagesCount());
     EXPECT_TRUE(ProbeEdit::HooksInstalled());
-
     BoxRecorder boxes;
     dlg.SetActiveWindow();
     MakeEdit1Invalid();
-    PostKey(edit1, VK_TAB);
-    PumpDialog(dlg);
+    Tab();
     EXPECT_EQ(1, boxes.count());
 }
 
@@ -497,8 +425,8 @@ TEST_F(EditBase, ASecondDisplayRequestWhileTheBoxIsUpOpensNoSecondBox)
 {
     BoxRecorder boxes;
     MakeEdit1Invalid();
-    ::PostMessageW(edit1, WM_USER + 100, 0, 0);
-    ::PostMessageW(edit1, WM_USER + 100, 0, 0);
+    ::PostMessageW(edit1, WM_KVX_SHOWERRORMESSAGE, 0, 0);
+    ::PostMessageW(edit1, WM_KVX_SHOWERRORMESSAGE, 0, 0);
     PumpDialog(dlg, 300);
     EXPECT_EQ(1, boxes.count());
 }

@@ -1,31 +1,28 @@
-// Shared set-up of the validated edit tests: modeless dialogs of the framework layer built
-// from in-memory templates, a pump that runs the dialog manager like a host's message
-// loop, and a recorder of the message boxes the edits show.
+// Shared set-up of the edits family: a modeless framework dialog (a host's page) built
+// from an in-memory template, a recorder of the message boxes the edits show, and test
+// subclasses of the numeric edits that reach the protected operations the spin calls and
+// log the value operations the spin's calls end in.
 #pragma once
 
 #include <afxwin.h>
 
+#include "DialogTemplate.h"
 #include "Input.h"
-#include "OrvaneControls.h"
+#include "KVXDoubleEdit.h"
+#include "KVXLongEdit.h"
+#include "KVXSpin.h"
+#include "OrvaneLibrary.h"
+#include "SpinGeometry.h"
 
 #include <gtest/gtest.h>
 
-#include <memory>
 #include <string>
 #include <vector>
 
 namespace edit_test {
 
-// The library's strings (the messages) are found only after this.
-inline void EnsureLibraryLoaded()
-{
-    static bool s_loaded = false;
-    if (!s_loaded)
-    {
-        LoadOrvaneControlsLibrary();
-        s_loaded = true;
-    }
-}
+using orvane_test::PumpDialog;
+using orvane_test::WindowText;
 
 inline std::string Narrow(const std::wstring& text)
 {
@@ -35,105 +32,22 @@ inline std::string Narrow(const std::wstring& text)
     return out;
 }
 
-inline std::wstring WindowText(HWND hwnd)
-{
-    if (hwnd == NULL)
-        return std::wstring();
-    const int length = ::GetWindowTextLengthW(hwnd);
-    std::wstring text(static_cast<size_t>(length) + 1, L'\0');
-    const int got = ::GetWindowTextW(hwnd, &text[0], length + 1);
-    text.resize(got > 0 ? static_cast<size_t>(got) : 0);
-    return text;
-}
-
-inline std::wstring LoadText(UINT id)
+inline std::string LoadText(UINT id)
 {
     CString text;
     text.LoadString(id);
-    return std::wstring((LPCTSTR)text);
+    return Narrow(static_cast<LPCTSTR>(text));
 }
 
 // Current selection of an edit as "start-end".
 inline std::string Selection(HWND edit)
 {
-    DWORD start = 0;
-    DWORD end = 0;
+    DWORD start = 0, end = 0;
     ::SendMessageW(edit, EM_GETSEL, reinterpret_cast<WPARAM>(&start), reinterpret_cast<LPARAM>(&end));
     return std::to_string(start) + "-" + std::to_string(end);
 }
 
-// Builds a DLGTEMPLATE with its items in memory (class atoms: 0x80 button, 0x81 edit).
-class DialogTemplate
-{
-public:
-    enum : WORD { Button = 0x0080, Edit = 0x0081, Static = 0x0082 };
-
-    DialogTemplate(const wchar_t* caption, short cx, short cy,
-        DWORD style = WS_POPUP | WS_CAPTION | WS_VISIBLE | DS_SETFONT)
-    {
-        AddDword(style);
-        AddDword(0);
-        m_countIndex = m_words.size();
-        m_words.push_back(0);   // number of items
-        m_words.push_back(10);  // x
-        m_words.push_back(10);  // y
-        m_words.push_back(static_cast<WORD>(cx));
-        m_words.push_back(static_cast<WORD>(cy));
-        m_words.push_back(0);   // no menu
-        m_words.push_back(0);   // default class
-        AddString(caption);
-        if (style & DS_SETFONT)
-        {
-            m_words.push_back(8);
-            AddString(L"MS Sans Serif");
-        }
-    }
-
-    void AddItem(WORD id, WORD classAtom, const wchar_t* text, short x, short y, short cx, short cy, DWORD style)
-    {
-        if (m_words.size() % 2 != 0)
-            m_words.push_back(0);   // items start on a DWORD boundary
-        AddDword(style | WS_CHILD | WS_VISIBLE);
-        AddDword(0);
-        m_words.push_back(static_cast<WORD>(x));
-        m_words.push_back(static_cast<WORD>(y));
-        m_words.push_back(static_cast<WORD>(cx));
-        m_words.push_back(static_cast<WORD>(cy));
-        m_words.push_back(id);
-        m_words.push_back(0xFFFF);
-        m_words.push_back(classAtom);
-        AddString(text);
-        m_words.push_back(0);       // no creation data
-        ++m_words[m_countIndex];
-    }
-
-    LPCDLGTEMPLATE Get() const { return reinterpret_cast<LPCDLGTEMPLATE>(m_words.data()); }
-
-private:
-    void AddDword(DWORD value)
-    {
-        m_words.push_back(LOWORD(value));
-        m_words.push_back(HIWORD(value));
-    }
-    void AddString(const wchar_t* text)
-    {
-        for (const wchar_t* p = text; *p; ++p)
-            m_words.push_back(static_cast<WORD>(*p));
-        m_words.push_back(0);
-    }
-
-    std::vector<WORD> m_words;
-    size_t m_countIndex = 0;
-};
-
-// Control ids of the standard test dialog.
-enum : UINT
-{
-    kIdEdit1 = 1001,
-    kIdEdit2 = 1002,
-    kIdButton = 1003,
-    kIdEdit3 = 1004,
-};
+enum : UINT { kIdEdit1 = 1001, kIdEdit2 = 1002, kIdButton = 1003, kIdEdit3 = 1004 };
 
 // A modeless dialog with three plain edits (to be subclassed or left alone) and a button.
 class TestDialog : public CDialog
@@ -141,27 +55,26 @@ class TestDialog : public CDialog
 public:
     bool Open(const wchar_t* caption = L"Edits")
     {
+        using orvane_test::DialogTemplate;
         DialogTemplate t(caption, 220, 100);
-        t.AddItem(kIdEdit1, DialogTemplate::Edit, L"", 10, 10, 80, 12, WS_BORDER | WS_TABSTOP | ES_AUTOHSCROLL);
-        t.AddItem(kIdEdit2, DialogTemplate::Edit, L"", 10, 30, 80, 12, WS_BORDER | WS_TABSTOP | ES_AUTOHSCROLL);
+        const DWORD style = WS_BORDER | WS_TABSTOP | ES_AUTOHSCROLL;
+        t.AddItem(kIdEdit1, DialogTemplate::Edit, L"", 10, 10, 80, 12, style);
+        t.AddItem(kIdEdit2, DialogTemplate::Edit, L"", 10, 30, 80, 12, style);
         t.AddItem(kIdButton, DialogTemplate::Button, L"Other", 120, 10, 50, 14, WS_TABSTOP | BS_PUSHBUTTON);
-        t.AddItem(kIdEdit3, DialogTemplate::Edit, L"", 10, 50, 80, 12, WS_BORDER | WS_TABSTOP | ES_AUTOHSCROLL);
+        t.AddItem(kIdEdit3, DialogTemplate::Edit, L"", 10, 50, 80, 12, style);
         return CreateIndirect(t.Get(), NULL) != FALSE;
     }
-
     HWND Item(UINT id) const { return ::GetDlgItem(m_hWnd, id); }
 
     // EN_CHANGE notifications that reached the dialog's own command handling, by control id.
     std::vector<UINT> changes;
-
-    virtual BOOL OnCmdMsg(UINT nID, int nCode, void* pExtra, AFX_CMDHANDLERINFO* pHandlerInfo)
+    BOOL OnCmdMsg(UINT nID, int nCode, void* pExtra, AFX_CMDHANDLERINFO* pHandlerInfo) override
     {
         if (pHandlerInfo == NULL && nCode == EN_CHANGE)
             changes.push_back(nID);
         return CDialog::OnCmdMsg(nID, nCode, pExtra, pHandlerInfo);
     }
-
-    virtual ~TestDialog()
+    ~TestDialog() override
     {
         if (::IsWindow(m_hWnd))
             DestroyWindow();
@@ -169,45 +82,9 @@ public:
 
 protected:
     // Enter and Escape must not end a modeless test dialog.
-    virtual void OnOK() {}
-    virtual void OnCancel() {}
+    void OnOK() override {}
+    void OnCancel() override {}
 };
-
-// Runs the queue the way a host's loop with a modeless dialog does: the dialog manager
-// sees keyboard messages first (Tab moves the focus). Bounded.
-inline int PumpDialog(HWND dialog, DWORD maxMs = 150)
-{
-    const DWORD start = ::GetTickCount();
-    int dispatched = 0;
-    MSG msg;
-    while (::GetTickCount() - start < maxMs)
-    {
-        if (!::PeekMessageW(&msg, NULL, 0, 0, PM_REMOVE))
-        {
-            ::Sleep(1);
-            if (!::PeekMessageW(&msg, NULL, 0, 0, PM_REMOVE))
-                break;
-        }
-        ++dispatched;
-        if (dialog != NULL && ::IsWindow(dialog) && ::IsDialogMessageW(dialog, &msg))
-            continue;
-        ::TranslateMessage(&msg);
-        ::DispatchMessageW(&msg);
-    }
-    return dispatched;
-}
-
-// Posts a key press the way the keyboard delivers it: through the queue, where the
-// edits' message hook sees it.
-inline void PostKey(HWND hwnd, UINT vk, bool alt = false)
-{
-    const UINT scan = ::MapVirtualKeyW(vk, MAPVK_VK_TO_VSC);
-    const UINT down = alt ? WM_SYSKEYDOWN : WM_KEYDOWN;
-    const UINT up = alt ? WM_SYSKEYUP : WM_KEYUP;
-    const LPARAM context = alt ? (1 << 29) : 0;
-    ::PostMessageW(hwnd, down, vk, 1 | (scan << 16) | context);
-    ::PostMessageW(hwnd, up, vk, 1 | (scan << 16) | context | 0xC0000000);
-}
 
 // Answers every message box with OK and keeps its text; dialogs without the message
 // box's text static (the test dialogs themselves) are left alone.
@@ -218,20 +95,146 @@ public:
         : m_answerer([this](const orvane_test::DialogAnswerer::Seen& seen) {
               if (::GetDlgItem(seen.hwnd, 0xFFFF) == NULL)
                   return 0;
-              m_texts.push_back(seen.text);
+              m_texts.push_back(Narrow(seen.text));
               return static_cast<int>(IDOK);
           })
     {
     }
-
     int count() const { return static_cast<int>(m_texts.size()); }
-    std::string last() const { return m_texts.empty() ? std::string("<no box>") : Narrow(m_texts.back()); }
-    const std::vector<std::wstring>& texts() const { return m_texts; }
-    void clear() { m_texts.clear(); }
+    std::string last() const { return m_texts.empty() ? std::string("<no box>") : m_texts.back(); }
 
 private:
-    std::vector<std::wstring> m_texts;
+    std::vector<std::string> m_texts;
     orvane_test::DialogAnswerer m_answerer;
+};
+
+// "mid(1)" for SetMiddleVal(TRUE), "inc(3)=103" for IncreaseValue(3) that showed "103".
+template <class Base>
+class NumericProbe : public Base
+{
+public:
+    using Base::Base;
+
+    void SpinUp() { this->OnSpinUpButton(); }
+    void SpinDown() { this->OnSpinDownButton(); }
+    void TwoSeconds() { this->OnSpinTimerTwoSecs(); }
+    void FiveSeconds() { this->OnSpinTimerFiveSecs(); }
+    void Released() { this->OnSpinTimerKill(); }
+    void SliderSet(int pressed) { this->OnSliderSet(pressed); }
+    void SliderMove(long distance) { this->OnSliderMove(distance); }
+
+    KVXSpin* Spin() const { return this->m_pSpin; }
+    HWND SpinHwnd() const { return this->GetSpinHwnd(); }
+    int Offset() const { return this->m_nSpinOffset; }
+    int StepFactor() const { return this->m_nSpinStep; }
+    std::string Message() const { return Narrow(static_cast<LPCTSTR>(this->m_strErrorMessage)); }
+    int ErrorPos() const { return this->m_nErrorPos; }
+    std::string Text() const { return Narrow(WindowText(this->m_hWnd)); }
+    const KVXVariant& Current() const { return this->m_varValue; }
+    const KVXVariant& CommittedValue() const { return this->m_varCommitted; }
+
+    std::vector<std::string> calls;
+    std::vector<std::string> shown;
+
+protected:
+    void SetMiddleVal(int bDetermineStep) override
+    {
+        calls.push_back("mid(" + std::to_string(bDetermineStep) + ")");
+        Base::SetMiddleVal(bDetermineStep);
+    }
+    int IncreaseValue(long lOffset) override { return Record("inc", lOffset, Base::IncreaseValue(lOffset)); }
+    int DecreaseValue(long lOffset) override { return Record("dec", lOffset, Base::DecreaseValue(lOffset)); }
+
+private:
+    int Record(const char* op, long lOffset, int result)
+    {
+        shown.push_back(Text());
+        calls.push_back(std::string(op) + "(" + std::to_string(lOffset) + ")=" + Text());
+        return result;
+    }
+};
+
+class LongProbe : public NumericProbe<KVXLongEdit>
+{
+public:
+    using NumericProbe<KVXLongEdit>::NumericProbe;
+    long CurrentLong() const { return AsLong(m_varValue); }
+    long CommittedLong() const { return AsLong(m_varCommitted); }
+    long Middle() const { return m_lMiddleVal; }
+    static long AsLong(const KVXVariant& v)
+    {
+        long value = -999999;
+        v.GetAs(value, 1);
+        return value;
+    }
+};
+
+class DoubleProbe : public NumericProbe<KVXDoubleEdit>
+{
+public:
+    double CurrentDouble() const { return AsDouble(m_varValue); }
+    double CommittedDouble() const { return AsDouble(m_varCommitted); }
+    double Middle() const { return m_dMiddleVal; }
+    static double AsDouble(const KVXVariant& v)
+    {
+        double value = -999999.0;
+        v.GetAs(value);
+        return value;
+    }
+};
+
+// Spin windows among the children of a parent.
+inline int CountSpins(HWND parent)
+{
+    int count = 0;
+    for (HWND child = ::GetWindow(parent, GW_CHILD); child != NULL; child = ::GetWindow(child, GW_HWNDNEXT))
+        count += dynamic_cast<KVXSpin*>(CWnd::FromHandlePermanent(child)) != nullptr ? 1 : 0;
+    return count;
+}
+
+inline std::string RectText(const RECT& r)
+{
+    return "(" + std::to_string(r.left) + "," + std::to_string(r.top) + "," + std::to_string(r.right) + ","
+        + std::to_string(r.bottom) + ")";
+}
+
+// A window's rectangle in its parent's client coordinates.
+inline RECT RectInParent(HWND hwnd)
+{
+    RECT r = {};
+    ::GetWindowRect(hwnd, &r);
+    ::MapWindowPoints(NULL, ::GetParent(hwnd), reinterpret_cast<POINT*>(&r), 2);
+    return r;
+}
+
+// A page with the library loaded; edits are created with Create at a rectangle of it.
+class NumericFixture : public testing::Test
+{
+protected:
+    static void SetUpTestSuite() { orvane_test::LoadLibraryOnce(); }
+    void SetUp() override { ASSERT_TRUE(dlg.Open()); }
+    void TearDown() override
+    {
+        if (::GetCapture() != NULL)
+            ::ReleaseCapture();
+        if (::IsWindow(dlg.m_hWnd))
+            dlg.DestroyWindow();
+        orvane_test::PumpUntilIdle(50);
+    }
+
+    template <class Edit>
+    void CreateIn(Edit& edit, const RECT& rect, UINT id = 2001)
+    {
+        ASSERT_TRUE(edit.Create(WS_CHILD | WS_VISIBLE | WS_BORDER | WS_TABSTOP | ES_AUTOHSCROLL, rect, &dlg, id));
+    }
+    template <class Edit>
+    void Type(Edit& edit, const wchar_t* text)
+    {
+        edit.SetSel(0, -1);
+        orvane_test::SendChars(edit, text);
+    }
+
+    TestDialog dlg;
 };
 
 } // namespace edit_test

@@ -4,6 +4,11 @@ namespace orvane_test {
 
 int PumpUntilIdle(DWORD maxMs)
 {
+    return PumpDialog(nullptr, maxMs);
+}
+
+int PumpDialog(HWND dialog, DWORD maxMs)
+{
     DWORD start = GetTickCount();
     int dispatched = 0;
     MSG msg;
@@ -16,9 +21,11 @@ int PumpUntilIdle(DWORD maxMs)
             if (!PeekMessageW(&msg, nullptr, 0, 0, PM_REMOVE))
                 break;
         }
+        ++dispatched;
+        if (dialog && IsWindow(dialog) && IsDialogMessageW(dialog, &msg))
+            continue;
         TranslateMessage(&msg);
         DispatchMessageW(&msg);
-        ++dispatched;
     }
     return dispatched;
 }
@@ -90,8 +97,12 @@ void SendClick(HWND hwnd, int x, int y, WPARAM keys)
     SendMessageW(hwnd, WM_LBUTTONUP, keys, PointParam(x, y));
 }
 
-namespace {
-thread_local DialogAnswerer* t_answerer = nullptr;
+void PostKey(HWND hwnd, UINT vk, bool alt)
+{
+    const LPARAM lParam = 1 | (MapVirtualKeyW(vk, MAPVK_VK_TO_VSC) << 16) | (alt ? 1 << 29 : 0);
+    PostMessageW(hwnd, alt ? WM_SYSKEYDOWN : WM_KEYDOWN, vk, lParam);
+    PostMessageW(hwnd, alt ? WM_SYSKEYUP : WM_KEYUP, vk, lParam | 0xC0000000);
+}
 
 std::wstring WindowText(HWND hwnd)
 {
@@ -103,7 +114,53 @@ std::wstring WindowText(HWND hwnd)
     s.resize(got > 0 ? static_cast<size_t>(got) : 0);
     return s;
 }
+
+namespace {
+
+bool SetClipboardBytes(HWND owner, UINT format, const void* bytes, size_t size)
+{
+    if (!OpenClipboard(owner))
+        return false;
+    EmptyClipboard();
+    HGLOBAL data = GlobalAlloc(GMEM_MOVEABLE, size);
+    if (data)
+    {
+        memcpy(GlobalLock(data), bytes, size);
+        GlobalUnlock(data);
+    }
+    const bool ok = data && SetClipboardData(format, data);
+    CloseClipboard();
+    return ok;
+}
+
+thread_local DialogAnswerer* t_answerer = nullptr;
+thread_local ModalScript* t_script = nullptr;
+
 } // namespace
+
+bool SetClipboardText(HWND owner, const std::wstring& text)
+{
+    return SetClipboardBytes(owner, CF_UNICODETEXT, text.c_str(), (text.size() + 1) * sizeof(wchar_t));
+}
+
+bool SetClipboardAnsi(HWND owner, const std::string& bytes)
+{
+    return SetClipboardBytes(owner, CF_TEXT, bytes.c_str(), bytes.size() + 1);
+}
+
+std::wstring ClipboardText(HWND owner)
+{
+    std::wstring text = L"<none>";
+    if (!OpenClipboard(owner))
+        return L"<locked>";
+    if (HANDLE data = GetClipboardData(CF_UNICODETEXT))
+    {
+        text = static_cast<const wchar_t*>(GlobalLock(data));
+        GlobalUnlock(data);
+    }
+    CloseClipboard();
+    return text;
+}
 
 DialogAnswerer::DialogAnswerer(int button)
     : DialogAnswerer(Handler([button](const Seen&) { return button; }))
@@ -148,6 +205,65 @@ void DialogAnswerer::OnActivate(HWND hwnd)
     int button = m_handler ? m_handler(seen) : 0;
     if (button)
         PostMessageW(hwnd, WM_COMMAND, MAKEWPARAM(button, BN_CLICKED), 0);
+}
+
+ModalScript::ModalScript(std::vector<Step> steps, DWORD timeLimitMs)
+    : m_steps(std::move(steps)), m_start(GetTickCount()), m_limit(timeLimitMs), m_previous(t_script)
+{
+    t_script = this;
+    m_timer = SetTimer(nullptr, 0, 15, TimerProc);
+}
+
+ModalScript::~ModalScript()
+{
+    KillTimer(nullptr, m_timer);
+    t_script = m_previous;
+}
+
+void CALLBACK ModalScript::TimerProc(HWND, UINT, UINT_PTR, DWORD)
+{
+    if (t_script)
+        t_script->Tick();
+}
+
+namespace {
+
+bool IsVisibleDialog(HWND hwnd)
+{
+    wchar_t cls[16] = {};
+    GetClassNameW(hwnd, cls, 16);
+    return hwnd && IsWindowVisible(hwnd) && lstrcmpW(cls, L"#32770") == 0;
+}
+
+BOOL CALLBACK CancelDialog(HWND hwnd, LPARAM)
+{
+    if (IsVisibleDialog(hwnd))
+        PostMessageW(hwnd, WM_COMMAND, IDCANCEL, 0);
+    return TRUE;
+}
+
+} // namespace
+
+void ModalScript::Tick()
+{
+    if (m_busy || (m_timedOut && m_next >= m_steps.size()))
+        return;
+    m_busy = true;
+    // Past the limit a dialog still up is cancelled, also one that outlives the last step.
+    if (GetTickCount() - m_start > m_limit && (m_next < m_steps.size() || IsVisibleDialog(GetActiveWindow())))
+    {
+        m_timedOut = true;
+        m_next = m_steps.size();
+        ReleaseCapture();
+        EnumThreadWindows(GetCurrentThreadId(), CancelDialog, 0);
+    }
+    else if (m_next < m_steps.size())
+    {
+        HWND active = GetActiveWindow();
+        if (IsVisibleDialog(active) && m_steps[m_next](active))
+            ++m_next;
+    }
+    m_busy = false;
 }
 
 HostWindow::HostWindow(int width, int height, DWORD style)

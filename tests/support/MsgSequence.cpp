@@ -115,6 +115,8 @@ void MsgLog::Add(int stream, const MsgEntry& entry)
     if (stream > 0 && stream < static_cast<int>(m_streams.size()))
         m_streams[stream].push_back(entry);
     m_streams[kCombined].push_back(entry);
+    if (onRecord)
+        onRecord(stream, entry);
 }
 
 void MsgLog::Flush()
@@ -243,37 +245,30 @@ testing::AssertionResult MsgLog::Match(int stream, const MsgEntry* expected, con
     return testing::AssertionFailure() << why.str();
 }
 
-NotifySpy::NotifySpy(HWND parent, UINT code, size_t payloadSize, bool command)
-    : m_parent(parent), m_code(code), m_payloadSize(payloadSize), m_command(command)
+NotifySpy::NotifySpy(HWND parent, UINT code, size_t payloadSize, bool command, UINT message)
+    : m_code(code), m_payloadSize(payloadSize), m_message(message ? message : command ? WM_COMMAND : WM_NOTIFY), m_log(1)
 {
-    SetWindowSubclass(parent, Proc, reinterpret_cast<UINT_PTR>(this), reinterpret_cast<DWORD_PTR>(this));
+    m_log.onRecord = [this](int, const MsgEntry& e) { OnRecord(e); };
+    m_log.SpyParent(parent, 0);
 }
 
-NotifySpy::~NotifySpy()
+void NotifySpy::OnRecord(const MsgEntry& e)
 {
-    if (IsWindow(m_parent))
-        RemoveWindowSubclass(m_parent, Proc, reinterpret_cast<UINT_PTR>(this));
-}
-
-LRESULT CALLBACK NotifySpy::Proc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam, UINT_PTR, DWORD_PTR data)
-{
-    NotifySpy* spy = reinterpret_cast<NotifySpy*>(data);
-    if (!spy->m_command && message == WM_NOTIFY && lParam &&
-        reinterpret_cast<NMHDR*>(lParam)->code == spy->m_code)
+    if (e.message == m_message && e.message == WM_COMMAND)
     {
-        const NMHDR* hdr = reinterpret_cast<NMHDR*>(lParam);
-        spy->m_ids.push_back(hdr->idFrom);
-        const BYTE* p = reinterpret_cast<const BYTE*>(lParam);
-        spy->m_payloads.emplace_back(p, p + spy->m_payloadSize);
+        if (HIWORD(e.wParam) == m_code)
+        {
+            m_ids.push_back(LOWORD(e.wParam));
+            m_payloads.emplace_back();
+        }
     }
-    else if (spy->m_command && message == WM_COMMAND && HIWORD(wParam) == spy->m_code)
+    else if (e.message == m_message && e.lParam && reinterpret_cast<const NMHDR*>(e.lParam)->code == m_code)
     {
-        spy->m_ids.push_back(LOWORD(wParam));
-        spy->m_payloads.emplace_back();
+        const BYTE* p = reinterpret_cast<const BYTE*>(e.lParam);
+        m_ids.push_back(e.message == WM_NOTIFY ? reinterpret_cast<const NMHDR*>(p)->idFrom : e.wParam);
+        m_payloads.emplace_back(p, p + m_payloadSize);
     }
-    if (message == WM_NCDESTROY)
-        RemoveWindowSubclass(hwnd, Proc, reinterpret_cast<UINT_PTR>(spy));
-    return DefSubclassProc(hwnd, message, wParam, lParam);
+    m_log.Flush();
 }
 
 } // namespace orvane_test

@@ -12,6 +12,7 @@
 
 #include <gtest/gtest.h>
 
+#include <functional>
 #include <string>
 #include <vector>
 
@@ -67,6 +68,10 @@ public:
     // Compares a stream with a table ending in {0}, then flushes that stream.
     testing::AssertionResult Match(int stream, const MsgEntry* expected, const char* file, int line);
 
+    // Called for every entry as it is recorded, while the message is still being sent:
+    // lParam still points at the sender's data and the control's state is that of the moment.
+    std::function<void(int stream, const MsgEntry&)> onRecord;
+
 private:
     struct Spy { HWND hwnd; int stream; bool parent; MsgLog* log; };
     static LRESULT CALLBACK SpyProc(HWND, UINT, WPARAM, LPARAM, UINT_PTR, DWORD_PTR);
@@ -79,27 +84,28 @@ private:
     EXPECT_TRUE((log).Match((stream), (table), __FILE__, __LINE__))
 
 // Counts one notification code (WM_NOTIFY) or one WM_COMMAND code reaching a parent,
-// keeping a copy of each payload's header fields.
+// keeping a copy of each payload's header fields. With `message` given, counts that
+// private message instead, whose lParam points at a block that starts with an NMHDR.
 class NotifySpy
 {
 public:
     // payloadSize: bytes of each WM_NOTIFY block to keep (the notification's own struct size).
-    NotifySpy(HWND parent, UINT code, size_t payloadSize = sizeof(NMHDR), bool command = false);
-    ~NotifySpy();
+    NotifySpy(HWND parent, UINT code, size_t payloadSize = sizeof(NMHDR), bool command = false, UINT message = 0);
     int count() const { return static_cast<int>(m_ids.size()); }
+    // Control ids: NMHDR::idFrom, LOWORD(wParam) of a WM_COMMAND, wParam of a private message.
     const std::vector<UINT_PTR>& senders() const { return m_ids; }
     // Raw copy of each WM_NOTIFY payload.
     const std::vector<std::vector<BYTE>>& payloads() const { return m_payloads; }
     void clear() { m_ids.clear(); m_payloads.clear(); }
 
 private:
-    static LRESULT CALLBACK Proc(HWND, UINT, WPARAM, LPARAM, UINT_PTR, DWORD_PTR);
-    HWND m_parent;
+    void OnRecord(const MsgEntry& e);
     UINT m_code;
     size_t m_payloadSize;
-    bool m_command;
+    UINT m_message;
     std::vector<UINT_PTR> m_ids;
     std::vector<std::vector<BYTE>> m_payloads;
+    MsgLog m_log;
 };
 
 } // namespace orvane_test

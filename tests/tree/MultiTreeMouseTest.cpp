@@ -1,15 +1,21 @@
 // Mouse handling of the multi-selection tree. Each press runs a nested loop, so the
 // messages it should see are posted before the button-down is sent; a posted probe
 // records the selection between the press and the release.
-// - click on an unselected item, on one item of a multiple selection, drag beyond the
-//   drag distance (TVN_BEGINDRAGW, selection kept), TVS_DISABLEDRAGDROP;
-// - Ctrl toggling at the release, Shift and Ctrl+Shift ranges, Shift without a caret;
+// - presses as a table: click on an unselected item, on one item of a multiple selection,
+//   drag beyond the drag distance (TVN_BEGINDRAGW, selection kept) or within it, Ctrl
+//   toggling at the release, Shift and Ctrl+Shift ranges, rubber bands (plain, Ctrl toggling
+//   and restoring, Shift taking over), a press on empty space;
+// - the anchor across presses and deletion; TVS_DISABLEDRAGDROP; labels-only banding;
 // - expand button and state icon handed to the tree; the right button;
-// - rubber band: plain, labels only, Ctrl toggling and restoring, Shift taking over,
-//   Escape, a press on empty space, auto-scroll by move and by timer ticks.
+// - a press ended by Escape, by a lost capture or by WM_QUIT;
+// - band geometry against the tree's own rows; auto-scroll by move and by timer ticks;
+// - the highlight of every selected label, not only the caret's, follows the focus.
 #include "TreeHarness.h"
 
 #include "Input.h"
+#include "TreeSelectionMath.h"
+
+#include <sstream>
 
 using namespace tree_test;
 
@@ -24,31 +30,28 @@ protected:
         Build(kSmallTree);
     }
 
-    // Press at pt with the messages queued before; the probe runs first in the loop.
-    void Press(CPoint pt, UINT keys, const std::vector<CPoint>& moves, bool release = true)
+    // Press at pt with the messages queued before; the probe runs first in the loop. A move
+    // at x = -1 stands for an Escape key press.
+    void Press(CPoint pt, UINT keys, const std::vector<CPoint>& moves)
     {
         PointCursorAt(pt);
         m_parent.PostProbe();
         for (const CPoint& move : moves)
-            PostMove(move, keys | MK_LBUTTON);
-        if (release)
-            PostButtonUp(moves.empty() ? pt : moves.back(), keys);
+            if (move.x == -1)
+                m_tree.PostMessage(WM_KEYDOWN, VK_ESCAPE, 0x00010001);
+            else
+                PostMove(move, keys | MK_LBUTTON);
+        PostButtonUp(moves.empty() ? pt : moves.back(), keys);
         SendButtonDown(pt, keys | MK_LBUTTON);
         orvane_test::PumpUntilIdle(50);
     }
-
-    std::string Probe() const
-    {
-        return m_parent.m_probes.empty() ? std::string("<no probe>") : m_parent.m_probes.front();
-    }
-
+    std::string Probe() const { return m_parent.m_probes.empty() ? "<no probe>" : m_parent.m_probes.front(); }
     std::string LastCode() const
     {
         const std::string trace = m_parent.Trace();
         const size_t blank = trace.rfind(' ');
         return blank == std::string::npos ? trace : trace.substr(blank + 1);
     }
-
     CPoint EmptySpaceBelowItems() const
     {
         CRect rcLast, rcClient;
@@ -56,191 +59,198 @@ protected:
         m_tree.GetClientRect(&rcClient);
         return CPoint(rcClient.CenterPoint().x, (rcLast.bottom + rcClient.bottom) / 2);
     }
+    // "B": B's label; ">B": right of B's label; "_": empty space below the items.
+    CPoint At(const std::string& where) const
+    {
+        return where == "_" ? EmptySpaceBelowItems() : where[0] == '>' ? RightOfLabel(where.substr(1)) : LabelPoint(where);
+    }
+    // Item names: that item's row at the press's x; "dx,dy": offsets from the press, where
+    // 'd' stands for the system's drag distance ("d+1,0" is one pixel beyond it); "esc".
+    std::vector<CPoint> Moves(const std::string& spec, CPoint press) const
+    {
+        std::vector<CPoint> moves;
+        std::istringstream words(spec);
+        for (std::string w; words >> w;)
+        {
+            const size_t comma = w.find(',');
+            if (comma == std::string::npos)
+            {
+                moves.emplace_back(w == "esc" ? -1 : press.x, w == "esc" ? 0 : LabelPoint(w).y);
+                continue;
+            }
+            auto offset = [](std::string part, int drag) {
+                const int sign = part[0] == '-' ? -1 : 1;
+                if (part[0] == '-' || part[0] == '+')
+                    part = part.substr(1);
+                if (part[0] != 'd')
+                    return sign * std::stoi(part);
+                return sign * drag + (part.size() > 1 ? std::stoi(part.substr(1)) : 0);
+            };
+            moves.emplace_back(press.x + offset(w.substr(0, comma), ::GetSystemMetrics(SM_CXDRAG)),
+                               press.y + offset(w.substr(comma + 1), ::GetSystemMetrics(SM_CYDRAG)));
+        }
+        return moves;
+    }
 };
 
-// ---------------------------------------------------------------------------------
-// Click or drag
-
-TEST_F(MouseTest, PressOnUnselectedItemSelectsOnlyItAtOnce)
+struct PressCase
 {
-    Arrange({ "A", "B" }, "A");
-    Press(LabelPoint("D"), 0, {});
-    EXPECT_EQ("D", Probe());
-    EXPECT_EQ("D", Selected());
-    EXPECT_EQ("D", Caret());
-    EXPECT_EQ("*click", LastCode());
-    EXPECT_EQ(m_tree.m_hWnd, ::GetFocus());
+    const char* name;
+    DWORD style;          // extra tree styles
+    const char* before;   // selected items
+    const char* caret;
+    const char* at;
+    UINT keys;
+    const char* moves;
+    const char* probe;    // the selection between press and release; nullptr: not checked
+    const char* selected;
+    const char* caretAfter;   // nullptr: not checked
+    const char* last;     // the last notification ([*]click, drag:+item); "-": neither click nor drag
+};
+
+const PressCase kPressCases[] = {
+    { "ClickOnAnUnselectedItemSelectsOnlyItAtOnce", 0, "A B", "A", "D", 0, "", "D", "D", "D", "*click" },
+    { "ClickInsideAMultipleSelectionKeepsItUntilRelease", 0, "A B D", "A", "B", 0, "", "A B D", "B", "B", "*click" },
+    { "DragBeyondTheDistanceKeepsTheSelection", 0, "A B D", "A", "B", 0, "d,0 d+1,0", nullptr, "A B D", "B", "*drag:+B" },
+    { "VerticalDragBeyondTheDistance", 0, "", "A", "C", 0, "0,-d-1", nullptr, "C", "C", "*drag:+C" },
+    { "MovesWithinTheDistanceStayAClick", 0, "A B D", "A", "B", 0, "d,-d -d,d", nullptr, "B", "B", "*click" },
+    { "CtrlClickAddsAtTheRelease", 0, "A B", "A", "D", MK_CONTROL, "", "A B", "A B D", "D", "*click" },
+    { "CtrlClickRemovesAtTheRelease", 0, "A B D", "D", "B", MK_CONTROL, "", "A B D", "A D", "B", "*click" },
+    { "ShiftClickSelectsTheRangeFromTheCaretAtThePress", 0, "A1", "A1", "C", MK_SHIFT, "", "A1 A2 A2a B C",
+      "A1 A2 A2a B C", "C", "*click" },
+    { "CtrlShiftClickAddsTheRange", 0, "B E", "B", "D", MK_SHIFT | MK_CONTROL, "", nullptr, "B C C1 D E", "D", "*click" },
+    { "ShiftClickWithoutACaretSelectsTheItemAlone", 0, "", "", "C", MK_SHIFT, "", nullptr, "C", "C", "*click" },
+    { "PressOnEmptySpaceClearsTheSelection", 0, "B D", "B", "_", 0, "", nullptr, "", nullptr, "*click" },
+    { "ShiftPressOnEmptySpaceKeepsIt", 0, "B D", "B", "_", MK_SHIFT, "", nullptr, "B D", nullptr, "*click" },
+    { "PlainBandSelectsTheTouchedRowsOnly", 0, "E", "A", ">B", 0, "C D", nullptr, "B C C1 D", "A", "*click" },
+    { "BandWithinTheDragDistanceDoesNotStart", 0, "E", "A", ">B", MK_CONTROL, "2,2", nullptr, "E", nullptr, "*click" },
+    { "CtrlBandTogglesSnapshotItems", 0, "B C", "A", ">A", MK_CONTROL, "C", nullptr, "A A1 A2 A2a", nullptr, "*click" },
+    { "CtrlBandRestoresSnapshotItemsWhenItLeavesThem", 0, "B C", "A", ">A", MK_CONTROL, "C A1", nullptr, "A A1 B C",
+      nullptr, "*click" },
+    { "ShiftBandTakesOverTheItemsItTouched", 0, "C E", "A", ">A", MK_SHIFT, "C A1", nullptr, "A A1 E", nullptr, "*click" },
+    { "DisabledDragDropSendsNoBeginDrag", TVS_DISABLEDRAGDROP, "A B", "A", "B", 0, "20,0", nullptr, "A B", "B", "-" },
+    { "EscapeClearsEverythingAndEndsTheBand", 0, "D E", "A", ">A", MK_CONTROL, "B esc E", nullptr, "", nullptr, "*click" },
+};
+
+TEST_F(MouseTest, Presses)
+{
+    for (const PressCase& c : kPressCases)
+    {
+        SCOPED_TRACE(c.name);
+        if (c.style != 0)
+        {
+            CreateTree(c.style);
+            Build(kSmallTree);
+        }
+        Arrange(c.before, c.caret);
+        const CPoint press = At(c.at);
+        Press(press, c.keys, Moves(c.moves, press));
+        if (c.probe != nullptr)
+            EXPECT_EQ(c.probe, Probe());
+        EXPECT_EQ(c.selected, Selected());
+        if (c.caretAfter != nullptr)
+            EXPECT_EQ(c.caretAfter, Caret());
+        if (std::string(c.last) == "-")
+        {
+            EXPECT_EQ(nullptr, m_parent.Last(NM_CLICK)) << m_parent.Trace();
+            EXPECT_EQ(nullptr, m_parent.Last(TVN_BEGINDRAGW)) << m_parent.Trace();
+        }
+        else
+        {
+            EXPECT_EQ(c.last, LastCode()) << m_parent.Trace();
+            EXPECT_EQ(m_tree.m_hWnd, ::GetFocus());
+        }
+        EXPECT_EQ(nullptr, ::GetCapture());
+        if (const CRecordingParent::Record* drag = m_parent.Last(TVN_BEGINDRAGW))
+        {
+            EXPECT_TRUE(drag->emulated);
+            EXPECT_EQ(LPARAM(m_tree.GetItemData(Item(drag->newName))), drag->newParam);
+            EXPECT_EQ(press.x, drag->ptDrag.x);
+            EXPECT_EQ(press.y, drag->ptDrag.y);
+            EXPECT_EQ(nullptr, m_parent.Last(NM_CLICK)) << "a drag is no click";
+        }
+        else if (!m_parent.m_selectionAtClick.empty())
+            EXPECT_EQ(c.selected, m_parent.m_selectionAtClick.back()) << "NM_CLICK comes after the selection";
+        if (c.style != 0)
+        {
+            CreateTree();
+            Build(kSmallTree);
+        }
+    }
 }
 
-TEST_F(MouseTest, PressInsideMultipleSelectionKeepsItUntilRelease)
+TEST_F(MouseTest, TheAnchorLastsAcrossShiftClicksUntilAPlainClickOrItsDeletion)
 {
-    Arrange({ "A", "B", "D" }, "A");
-    Press(LabelPoint("B"), 0, {});
-    EXPECT_EQ("A B D", Probe());
-    EXPECT_EQ("B", Selected());
-    EXPECT_EQ("B", Caret());
-    ASSERT_EQ(1u, m_parent.m_selectionAtClick.size());
-    EXPECT_EQ("B", m_parent.m_selectionAtClick[0]);
-}
-
-TEST_F(MouseTest, DragBeyondDistanceSendsBeginDragAndKeepsSelection)
-{
-    Arrange({ "A", "B", "D" }, "A");
-    const CPoint press = LabelPoint("B");
-    const int cx = ::GetSystemMetrics(SM_CXDRAG);
-    Press(press, 0, { CPoint(press.x + cx, press.y), CPoint(press.x + cx + 1, press.y) });
-    EXPECT_EQ("A B D", Selected());
-    EXPECT_EQ("B", Caret());
-    const CRecordingParent::Record* drag = m_parent.Last(TVN_BEGINDRAGW);
-    ASSERT_NE(nullptr, drag) << m_parent.Trace();
-    EXPECT_TRUE(drag->emulated);
-    EXPECT_EQ("B", drag->newName);
-    EXPECT_EQ(static_cast<LPARAM>(m_tree.GetItemData(Item("B"))), drag->newParam);
-    EXPECT_EQ(press.x, drag->ptDrag.x);
-    EXPECT_EQ(press.y, drag->ptDrag.y);
-    EXPECT_EQ(nullptr, m_parent.Last(NM_CLICK)) << m_parent.Trace();
-}
-
-TEST_F(MouseTest, VerticalMoveBeyondDistanceIsDragToo)
-{
-    Arrange({}, "A");
-    const CPoint press = LabelPoint("C");
-    const int cy = ::GetSystemMetrics(SM_CYDRAG);
-    Press(press, 0, { CPoint(press.x, press.y - cy - 1) });
-    EXPECT_EQ("*drag:+C", LastCode());
-    EXPECT_EQ("C", Selected());
-}
-
-TEST_F(MouseTest, MoveWithinDistanceStaysAClick)
-{
-    Arrange({ "A", "B", "D" }, "A");
-    const CPoint press = LabelPoint("B");
-    const int cx = ::GetSystemMetrics(SM_CXDRAG);
-    const int cy = ::GetSystemMetrics(SM_CYDRAG);
-    Press(press, 0, { CPoint(press.x + cx, press.y - cy), CPoint(press.x - cx, press.y + cy) });
-    EXPECT_EQ(nullptr, m_parent.Last(TVN_BEGINDRAGW)) << m_parent.Trace();
-    EXPECT_EQ("B", Selected());
-    EXPECT_EQ("*click", LastCode());
-}
-
-TEST_F(MouseTest, DisabledDragDropSendsNoBeginDrag)
-{
-    CreateTree(TVS_DISABLEDRAGDROP);
-    Build(kSmallTree);
-    Arrange({ "A", "B" }, "A");
-    const CPoint press = LabelPoint("B");
-    Press(press, 0, { CPoint(press.x + 20, press.y) });
-    EXPECT_EQ(nullptr, m_parent.Last(TVN_BEGINDRAGW)) << m_parent.Trace();
-    EXPECT_EQ(nullptr, m_parent.Last(NM_CLICK)) << m_parent.Trace();
-    EXPECT_EQ("A B", Selected());
-    EXPECT_EQ("B", Caret());
-}
-
-// ---------------------------------------------------------------------------------
-// Modifier keys
-
-TEST_F(MouseTest, CtrlClickTogglesAtReleaseOnly)
-{
-    Arrange({ "A", "B" }, "A");
-    Press(LabelPoint("D"), MK_CONTROL, {});
-    EXPECT_EQ("A B", Probe());
-    EXPECT_EQ("A B D", Selected());
-    EXPECT_EQ("D", Caret());
-
-    m_parent.m_probes.clear();
-    Press(LabelPoint("B"), MK_CONTROL, {});
-    EXPECT_EQ("A B D", Probe());
-    EXPECT_EQ("A D", Selected());
-    EXPECT_EQ("B", Caret());
-    EXPECT_EQ(static_cast<UINT>(TVIS_FOCUSED), m_tree.GetItemState(Item("B"), TVIS_FOCUSED | TVIS_SELECTED));
-    EXPECT_EQ(NULL, m_tree.Anchor());
-}
-
-TEST_F(MouseTest, ShiftClickSelectsRangeFromCaretAndKeepsAnchor)
-{
-    Arrange({ "A1" }, "A1");
+    Arrange("A1", "A1");
     Press(LabelPoint("C"), MK_SHIFT, {});
-    EXPECT_EQ("A1 A2 A2a B C", Probe());   // the range is made at the press
-    EXPECT_EQ("A1 A2 A2a B C", Selected());
-    EXPECT_EQ("C", Caret());
     EXPECT_EQ(Item("A1"), m_tree.Anchor());
-
     Press(LabelPoint("A"), MK_SHIFT, {});
     EXPECT_EQ("A A1", Selected());
-    EXPECT_EQ("A", Caret());
     EXPECT_EQ(Item("A1"), m_tree.Anchor());
-}
-
-TEST_F(MouseTest, CtrlShiftClickAddsRange)
-{
-    Arrange({ "E" }, "B");
-    m_tree.CTreeCtrl::SetItemState(Item("B"), TVIS_SELECTED, TVIS_SELECTED);
-    Press(LabelPoint("D"), MK_SHIFT | MK_CONTROL, {});
-    EXPECT_EQ("B C C1 D E", Selected());
-    EXPECT_EQ("D", Caret());
-}
-
-TEST_F(MouseTest, ShiftClickWithoutCaretSelectsTheItemAlone)
-{
-    Arrange({}, "");
+    Press(LabelPoint("B"), MK_CONTROL, {});
+    EXPECT_EQ(NULL, m_tree.Anchor());
     Press(LabelPoint("C"), MK_SHIFT, {});
-    EXPECT_EQ("C", Selected());
-    EXPECT_EQ("C", Caret());
-}
-
-TEST_F(MouseTest, PlainClickClearsAnchor)
-{
-    Arrange({ "B" }, "B");
-    Press(LabelPoint("C"), MK_SHIFT, {});
-    EXPECT_EQ(Item("B"), m_tree.Anchor());
     Press(LabelPoint("E"), 0, {});
     EXPECT_EQ(NULL, m_tree.Anchor());
     Press(LabelPoint("D"), MK_SHIFT, {});
     EXPECT_EQ("D E", Selected());
+    EXPECT_EQ(Item("E"), m_tree.Anchor());
+    m_tree.DeleteItem(Item("E"));
+    EXPECT_EQ(NULL, m_tree.Anchor());
+    Press(LabelPoint("B"), MK_SHIFT, {});
+    EXPECT_EQ("B C C1 D", Selected());   // from the caret, not from a stale handle
 }
 
-// ---------------------------------------------------------------------------------
-// Presses the tree handles itself; the right button
-
-TEST_F(MouseTest, ExpandButtonIsHandledByTheTree)
+TEST_F(MouseTest, BandingHitTestsLabelsInsteadOfRows)
 {
-    Arrange({ "B" }, "B");
+    CRect rcClient;
+    m_tree.GetClientRect(&rcClient);
+    const CPoint start(rcClient.right - 4, LabelPoint("B").y);
+    const CPoint end(rcClient.right - 12, LabelPoint("D").y);
+    Arrange("", "A");
+    Press(start, 0, { end });
+    EXPECT_EQ("B C C1 D", Selected());
+    Arrange("", "A");
+    EXPECT_FALSE(m_tree.SetBandingHit(TRUE));
+    Press(start, 0, { end });
+    EXPECT_EQ("", Selected());
+    Arrange("", "A");
+    Press(start, 0, { CPoint(LabelPoint("D").x, end.y) });
+    EXPECT_EQ("B C C1 D", Selected());
+}
+
+TEST_F(MouseTest, ExpandButtonAndStateIconAreHandledByTheTree)
+{
+    Arrange("B", "B");
     m_tree.Expand(Item("C"), TVE_COLLAPSE);
     Click(PointWithHit("C", TVHT_ONITEMBUTTON));
-    EXPECT_EQ(static_cast<UINT>(TVIS_EXPANDED), m_tree.GetItemState(Item("C"), TVIS_EXPANDED));
+    EXPECT_EQ(UINT(TVIS_EXPANDED), m_tree.GetItemState(Item("C"), TVIS_EXPANDED));
     EXPECT_EQ("B", Selected());
-    EXPECT_EQ("B", Caret());
     EXPECT_EQ(std::string::npos, m_parent.Trace().find('*')) << m_parent.Trace();
-}
 
-TEST_F(MouseTest, StateIconTogglesCheckBoxInTree)
-{
     CreateTree(TVS_CHECKBOXES);
     Build(kSmallTree);
     m_tree.UpdateWindow();   // the state images appear with the first paint
-    Arrange({ "A" }, "A");
-    EXPECT_FALSE(m_tree.GetCheck(Item("B")));
+    Arrange("A", "A");
     Click(PointWithHit("B", TVHT_ONITEMSTATEICON));
     EXPECT_TRUE(m_tree.GetCheck(Item("B")));
     EXPECT_EQ("A", Selected());
     EXPECT_EQ(std::string::npos, m_parent.Trace().find('*')) << m_parent.Trace();
 }
 
-TEST_F(MouseTest, RightButtonSelectsWithoutTouchingAnchorAndSendsRClick)
+TEST_F(MouseTest, RightButtonSelectsWithoutTouchingTheAnchorAndSendsRClickOrRDrag)
 {
-    Arrange({ "A", "B" }, "A");
+    Arrange("A B", "A");
     m_tree.SetAnchor(Item("A"));
-    const CPoint pt = LabelPoint("D");
-    PostButtonUp(pt, 0, WM_RBUTTONUP);
+    PostButtonUp(LabelPoint("D"), 0, WM_RBUTTONUP);
     {
         PressWatchdog watchdog;
-        m_tree.OnButtonDown(FALSE, MK_RBUTTON, pt);
+        m_tree.OnButtonDown(FALSE, MK_RBUTTON, LabelPoint("D"));
     }
     EXPECT_EQ("D", Selected());
     EXPECT_EQ("D", Caret());
     EXPECT_EQ(Item("A"), m_tree.Anchor());
     EXPECT_EQ("*rclick", LastCode());
-
     PostButtonUp(LabelPoint("B"), 0, WM_RBUTTONUP);
     {
         PressWatchdog watchdog;
@@ -248,11 +258,8 @@ TEST_F(MouseTest, RightButtonSelectsWithoutTouchingAnchorAndSendsRClick)
     }
     EXPECT_EQ(Item("B"), m_tree.Anchor());
     EXPECT_EQ("D", Selected());
-}
 
-TEST_F(MouseTest, RightDragSendsBeginRDrag)
-{
-    Arrange({ "A", "B" }, "A");
+    Arrange("A B", "A");
     const CPoint pt = LabelPoint("B");
     PostMove(CPoint(pt.x, pt.y + 30), MK_RBUTTON);
     {
@@ -264,12 +271,11 @@ TEST_F(MouseTest, RightDragSendsBeginRDrag)
     EXPECT_EQ("A B", Selected());
 }
 
-TEST_F(MouseTest, CaptureLostEndsPressWithoutClick)
+TEST_F(MouseTest, CaptureLostEndsAPressWithoutClickAndABandAsAfterARelease)
 {
-    Arrange({ "A" }, "A");
-    // Another window takes the capture in the middle of the press.
     CWnd other;
     ASSERT_TRUE(other.CreateEx(0, AfxRegisterWndClass(0), _T("other"), WS_POPUP, 0, 0, 10, 10, NULL, NULL));
+    Arrange("A", "A");
     PointCursorAt(LabelPoint("C"));
     m_parent.PostMessage(CRecordingParent::kCaptureMessage, reinterpret_cast<WPARAM>(other.m_hWnd));
     SendButtonDown(LabelPoint("C"));
@@ -279,8 +285,7 @@ TEST_F(MouseTest, CaptureLostEndsPressWithoutClick)
     EXPECT_EQ(nullptr, m_parent.Last(NM_CLICK)) << m_parent.Trace();
     EXPECT_EQ(nullptr, m_parent.Last(TVN_BEGINDRAGW)) << m_parent.Trace();
 
-    // A band ends as after a release: NM_CLICK, and the selection stays as it was.
-    Arrange({ "B", "D" }, "B");
+    Arrange("B D", "B");
     m_parent.PostMessage(CRecordingParent::kCaptureMessage, reinterpret_cast<WPARAM>(other.m_hWnd));
     SendButtonDown(RightOfLabel("A"), MK_LBUTTON | MK_CONTROL);
     EXPECT_EQ(other.m_hWnd, ::GetCapture());
@@ -290,134 +295,26 @@ TEST_F(MouseTest, CaptureLostEndsPressWithoutClick)
     other.DestroyWindow();
 }
 
-TEST_F(MouseTest, QuitDuringPressIsKeptForTheApplication)
+TEST_F(MouseTest, QuitDuringAPressIsKeptForTheApplication)
 {
-    Arrange({ "A" }, "A");
-    PointCursorAt(LabelPoint("C"));
-    ::PostQuitMessage(3);
-    SendButtonDown(LabelPoint("C"));
-    EXPECT_EQ(nullptr, ::GetCapture());
-    EXPECT_EQ(nullptr, m_parent.Last(NM_CLICK)) << m_parent.Trace();
-    MSG msg;
-    ASSERT_TRUE(::PeekMessage(&msg, NULL, WM_QUIT, WM_QUIT, PM_REMOVE));
-    EXPECT_EQ(3u, msg.wParam);
-
-    // The same for a band.
-    ::PostQuitMessage(4);
-    SendButtonDown(RightOfLabel("B"));
-    EXPECT_EQ(nullptr, ::GetCapture());
-    ASSERT_TRUE(::PeekMessage(&msg, NULL, WM_QUIT, WM_QUIT, PM_REMOVE));
-    EXPECT_EQ(4u, msg.wParam);
+    Arrange("A", "A");
+    for (const char* at : { "C", ">B" })
+    {
+        SCOPED_TRACE(at);
+        m_parent.ClearTrace();
+        PointCursorAt(At(at));
+        ::PostQuitMessage(3);
+        SendButtonDown(At(at));
+        EXPECT_EQ(nullptr, ::GetCapture());
+        if (at[0] != '>')
+            EXPECT_EQ(nullptr, m_parent.Last(NM_CLICK)) << m_parent.Trace();
+        MSG msg;
+        ASSERT_TRUE(::PeekMessage(&msg, NULL, WM_QUIT, WM_QUIT, PM_REMOVE));
+        EXPECT_EQ(3u, msg.wParam);
+    }
 }
 
-TEST_F(MouseTest, DeletingTheAnchorForgetsIt)
-{
-    Arrange({ "B" }, "B");
-    Press(LabelPoint("D"), MK_SHIFT, {});
-    EXPECT_EQ(Item("B"), m_tree.Anchor());
-    m_tree.DeleteItem(Item("B"));
-    EXPECT_EQ(NULL, m_tree.Anchor());
-    Press(LabelPoint("E"), MK_SHIFT, {});
-    EXPECT_EQ("D E", Selected());   // from the caret, not from a stale handle
-}
-
-// ---------------------------------------------------------------------------------
-// Rubber band
-
-TEST_F(MouseTest, PressOnEmptySpaceClearsSelectionAndSendsClick)
-{
-    Arrange({ "B", "D" }, "B");
-    Press(EmptySpaceBelowItems(), 0, {});
-    EXPECT_EQ("", Selected());
-    EXPECT_EQ("*click", LastCode());
-    EXPECT_EQ(m_tree.m_hWnd, ::GetFocus());
-
-    Arrange({ "B", "D" }, "B");
-    Press(EmptySpaceBelowItems(), MK_SHIFT, {});
-    EXPECT_EQ("B D", Selected());
-    EXPECT_EQ("*click", LastCode());
-}
-
-TEST_F(MouseTest, PlainBandSelectsTouchedRowsOnly)
-{
-    Arrange({ "E" }, "A");
-    const CPoint start = RightOfLabel("B");
-    Press(start, 0, { CPoint(start.x - 5, LabelPoint("C").y), CPoint(start.x - 5, LabelPoint("D").y) });
-    EXPECT_EQ("B C C1 D", Selected());
-    EXPECT_EQ("*click", LastCode());
-    EXPECT_EQ("A", Caret());
-}
-
-TEST_F(MouseTest, BandWithinDragDistanceDoesNotStart)
-{
-    Arrange({ "E" }, "A");
-    const CPoint start = RightOfLabel("B");
-    Press(start, MK_CONTROL, { CPoint(start.x + 2, start.y + 2) });
-    EXPECT_EQ("E", Selected());
-    EXPECT_EQ("*click", LastCode());
-}
-
-TEST_F(MouseTest, BandingHitTestsLabelsInsteadOfRows)
-{
-    CRect rcClient;
-    m_tree.GetClientRect(&rcClient);
-    const CPoint start(rcClient.right - 4, LabelPoint("B").y);
-    const CPoint end(rcClient.right - 12, LabelPoint("D").y);
-
-    Arrange({}, "A");
-    Press(start, 0, { end });
-    EXPECT_EQ("B C C1 D", Selected());
-
-    Arrange({}, "A");
-    EXPECT_FALSE(m_tree.SetBandingHit(TRUE));
-    Press(start, 0, { end });
-    EXPECT_EQ("", Selected());
-
-    Arrange({}, "A");
-    Press(start, 0, { CPoint(LabelPoint("D").x, end.y) });
-    EXPECT_EQ("B C C1 D", Selected());
-}
-
-TEST_F(MouseTest, CtrlBandTogglesSnapshotItems)
-{
-    Arrange({ "B", "C" }, "A");
-    const CPoint start = RightOfLabel("A");
-    Press(start, MK_CONTROL, { CPoint(start.x, LabelPoint("C").y) });
-    EXPECT_EQ("A A1 A2 A2a", Selected());
-}
-
-TEST_F(MouseTest, CtrlBandRestoresSnapshotItemsWhenItLeavesThem)
-{
-    Arrange({ "B", "C" }, "A");
-    const CPoint start = RightOfLabel("A");
-    Press(start, MK_CONTROL, { CPoint(start.x, LabelPoint("C").y), CPoint(start.x, LabelPoint("A1").y) });
-    EXPECT_EQ("A A1 B C", Selected());
-}
-
-TEST_F(MouseTest, ShiftBandTakesOverTouchedItems)
-{
-    Arrange({ "C", "E" }, "A");
-    const CPoint start = RightOfLabel("A");
-    Press(start, MK_SHIFT, { CPoint(start.x, LabelPoint("C").y), CPoint(start.x, LabelPoint("A1").y) });
-    EXPECT_EQ("A A1 E", Selected());   // C was touched, so it left with the band
-}
-
-TEST_F(MouseTest, EscapeClearsEverythingAndEndsBand)
-{
-    Arrange({ "D", "E" }, "A");
-    const CPoint start = RightOfLabel("A");
-    PointCursorAt(start);
-    PostMove(CPoint(start.x, LabelPoint("B").y));
-    m_tree.PostMessage(WM_KEYDOWN, VK_ESCAPE, 0x00010001);
-    PostMove(CPoint(start.x, LabelPoint("E").y));   // after the band: not a band move
-    PostButtonUp(CPoint(start.x, LabelPoint("E").y));
-    SendButtonDown(start, MK_LBUTTON | MK_CONTROL);
-    EXPECT_EQ("", Selected());
-    EXPECT_EQ("*click", LastCode());
-    EXPECT_EQ(nullptr, ::GetCapture());
-    orvane_test::PumpUntilIdle(50);
-    EXPECT_EQ("", Selected());
-}
+// --- geometry and auto-scroll --------------------------------------------------------
 
 class ScrollingBandTest : public TreeFixture
 {
@@ -428,20 +325,19 @@ protected:
         BuildFlat(60);
         m_tree.GetClientRect(&m_rcClient);
         m_nItemHeight = m_tree.GetItemHeight();
+        Arrange("", "I0");
     }
-
-    // The item whose row holds client y after the band, from the tree's own rectangles.
-    std::string ItemAtClientY(int y) const
+    // The item whose row holds client y, from the tree's own rectangles.
+    int RowAt(int y) const
     {
         for (HTREEITEM h = m_tree.GetRootItem(); h != NULL; h = m_tree.GetNextVisibleItem(h))
         {
             CRect rc;
             if (m_tree.GetItemRect(h, &rc, FALSE) && y >= rc.top && y < rc.bottom)
-                return ItemName(m_tree, h);
+                return std::stoi(ItemName(m_tree, h).substr(1));
         }
-        return std::string();
+        return -1;
     }
-
     std::string Range(int first, int last) const
     {
         std::string names;
@@ -449,14 +345,45 @@ protected:
             names += (names.empty() ? "I" : " I") + std::to_string(i);
         return names;
     }
+    void ScrollTo(int row)
+    {
+        m_tree.SendMessage(WM_VSCROLL, MAKEWPARAM(SB_THUMBPOSITION, row), 0);
+        m_tree.SendMessage(WM_VSCROLL, SB_ENDSCROLL, 0);
+    }
 
     CRect m_rcClient;
     int m_nItemHeight = 0;
 };
 
-TEST_F(ScrollingBandTest, MoveAndTicksBelowClientScrollAndKeepStartInContent)
+TEST_F(ScrollingBandTest, BandOnEachRowEdgeSelectsThatRowOnly)
 {
-    Arrange({}, "I0");
+    m_tree.ShowWindow(SW_HIDE);   // geometry only: no repainting per change
+    for (const char* name : { "I3", "I10", "I11" })
+    {
+        TVITEMEXW item = {};
+        item.mask = TVIF_HANDLE | TVIF_INTEGRAL;
+        item.hItem = Item(name);
+        item.iIntegral = name[2] == '0' ? 3 : 2;
+        ASSERT_TRUE(m_tree.SendMessage(TVM_SETITEMW, 0, reinterpret_cast<LPARAM>(&item)));
+    }
+    ScrollTo(6);   // rows above the client area too
+    for (HTREEITEM h = m_tree.GetRootItem(); h != NULL; h = m_tree.GetNextVisibleItem(h))
+    {
+        CRect rc;
+        ASSERT_TRUE(m_tree.GetItemRect(h, &rc, FALSE));
+        for (int y : { int(rc.top), int(rc.bottom) - 1 })
+        {
+            Arrange("", "");
+            TreeSelectionMath::SelectionSnapshot none;
+            const CRect band(5, y, 9, y);
+            m_tree.UpdateSelectionForRect(&band, 0, none);
+            EXPECT_EQ(ItemName(m_tree, h), Selected()) << "row line " << y;
+        }
+    }
+}
+
+TEST_F(ScrollingBandTest, MovesAndTicksOutsideTheClientAreaScrollKeepingTheStartInContent)
+{
     const CPoint start = RightOfLabel("I2");
     const CPoint below(start.x, m_rcClient.bottom + 5);
     // Timer messages carry the pointer's screen position: park it below the tree.
@@ -466,32 +393,25 @@ TEST_F(ScrollingBandTest, MoveAndTicksBelowClientScrollAndKeepStartInContent)
         m_tree.PostMessage(WM_TIMER, 1, 0);
     PostButtonUp(below);
     SendButtonDown(start);
-
     EXPECT_EQ(4, m_tree.GetScrollPos(SB_VERT));
-    const std::string last = ItemAtClientY(below.y);
-    ASSERT_FALSE(last.empty());
-    EXPECT_EQ(Range(2, std::stoi(last.substr(1))), Selected());
-    EXPECT_EQ(4 + below.y / m_nItemHeight, std::stoi(last.substr(1)));
+    EXPECT_EQ(4 + below.y / m_nItemHeight, RowAt(below.y));
+    EXPECT_EQ(Range(2, RowAt(below.y)), Selected());
+
+    Arrange("", "I0");
+    ScrollTo(10);
+    const CPoint from = RightOfLabel("I14");   // fifth visible row
+    const CPoint above(from.x, -5);
+    PointCursorAt(above);
+    PostMove(above);
+    m_tree.PostMessage(WM_TIMER, 1, 0);
+    PostButtonUp(above);
+    SendButtonDown(from);
+    EXPECT_EQ(8, m_tree.GetScrollPos(SB_VERT));
+    EXPECT_EQ(Range(7, 14), Selected());   // up to the row at y = -5
 }
 
-TEST_F(ScrollingBandTest, TicksInsideClientDoNotScroll)
+TEST_F(ScrollingBandTest, TimersOfOtherWindowsOrIdsDoNotScroll)
 {
-    Arrange({}, "I0");
-    const CPoint start = RightOfLabel("I2");
-    const CPoint inside(start.x, LabelPoint("I6").y);
-    PointCursorAt(inside);
-    PostMove(inside);
-    for (int i = 0; i < 3; ++i)
-        m_tree.PostMessage(WM_TIMER, 1, 0);
-    PostButtonUp(inside);
-    SendButtonDown(start);
-    EXPECT_EQ(0, m_tree.GetScrollPos(SB_VERT));
-    EXPECT_EQ(Range(2, 6), Selected());
-}
-
-TEST_F(ScrollingBandTest, TimersOfOtherWindowsDoNotScroll)
-{
-    Arrange({}, "I0");
     const CPoint start = RightOfLabel("I2");
     const CPoint inside(start.x, LabelPoint("I6").y);
     PointCursorAt(CPoint(start.x, m_rcClient.bottom + 5));
@@ -505,24 +425,6 @@ TEST_F(ScrollingBandTest, TimersOfOtherWindowsDoNotScroll)
     EXPECT_EQ(Range(2, 6), Selected());
 }
 
-TEST_F(ScrollingBandTest, AboveClientScrollsBackUp)
-{
-    Arrange({}, "I0");
-    m_tree.SendMessage(WM_VSCROLL, MAKEWPARAM(SB_THUMBPOSITION, 10), 0);
-    m_tree.SendMessage(WM_VSCROLL, SB_ENDSCROLL, 0);
-    ASSERT_EQ(10, m_tree.GetScrollPos(SB_VERT));
-    const CPoint start = RightOfLabel("I14");   // fifth visible row
-    const CPoint above(start.x, -5);
-    PointCursorAt(above);
-    PostMove(above);
-    m_tree.PostMessage(WM_TIMER, 1, 0);
-    PostButtonUp(above);
-    SendButtonDown(start);
-    EXPECT_EQ(8, m_tree.GetScrollPos(SB_VERT));
-    // The band reaches from I14 up to the row at y = -5: I7.
-    EXPECT_EQ(Range(7, 14), Selected());
-}
-
 HWND g_hReleaseTarget = NULL;
 
 void CALLBACK PostRelease(HWND, UINT, UINT_PTR id, DWORD)
@@ -531,9 +433,8 @@ void CALLBACK PostRelease(HWND, UINT, UINT_PTR id, DWORD)
     ::PostMessage(g_hReleaseTarget, WM_LBUTTONUP, 0, 0);
 }
 
-TEST_F(ScrollingBandTest, HeldBelowClientScrollsOneLinePerTick)
+TEST_F(ScrollingBandTest, HeldBelowTheClientAreaScrollsOneLinePerTick)
 {
-    Arrange({}, "I0");
     // Start on the last whole row: the first band update selects two rows, each tick
     // one more, so that the ticks are not held up by repainting.
     const int lastRow = m_rcClient.bottom / m_nItemHeight - 1;
@@ -542,8 +443,7 @@ TEST_F(ScrollingBandTest, HeldBelowClientScrollsOneLinePerTick)
     PointCursorAt(below);
     // A thread timer ends the band after 400 ms: about five ticks of 75 ms.
     g_hReleaseTarget = m_tree.m_hWnd;
-    const UINT_PTR timer = ::SetTimer(NULL, 0, 400, &PostRelease);
-    ASSERT_NE(0u, timer);
+    ASSERT_NE(0u, ::SetTimer(NULL, 0, 400, &PostRelease));
     PostMove(below);
     const DWORD t0 = ::GetTickCount();
     SendButtonDown(start);
@@ -554,9 +454,37 @@ TEST_F(ScrollingBandTest, HeldBelowClientScrollsOneLinePerTick)
     // One line for the move, then one per tick; a busy machine may lose a tick or two.
     EXPECT_GE(lines, 3) << "elapsed " << elapsed;
     EXPECT_LE(lines, 1 + static_cast<int>(elapsed / 75)) << "elapsed " << elapsed;
-    const std::string last = ItemAtClientY(below.y);
-    ASSERT_FALSE(last.empty());
-    EXPECT_EQ(Range(lastRow, std::stoi(last.substr(1))), Selected());
+    EXPECT_EQ(Range(lastRow, RowAt(below.y)), Selected());
+}
+
+TEST_F(MouseTest, SelectedLabelsFollowTheFocus)
+{
+    Arrange("A C", "C");
+    m_tree.SetFocus();
+    m_tree.RedrawWindow();
+    // Pixels of the highlight colour inside an item's label, as on screen now.
+    auto highlighted = [this](const char* name) {
+        m_tree.UpdateWindow();
+        CRect rc;
+        m_tree.GetItemRect(Item(name), &rc, TRUE);
+        HDC dc = ::GetDC(m_tree.m_hWnd);
+        int count = 0;
+        for (int y = rc.top; y < rc.bottom; ++y)
+            for (int x = rc.left; x < rc.right; ++x)
+                count += ::GetPixel(dc, x, y) == ::GetSysColor(COLOR_HIGHLIGHT) ? 1 : 0;
+        ::ReleaseDC(m_tree.m_hWnd, dc);
+        return count;
+    };
+    EXPECT_GT(highlighted("A"), 0);
+    EXPECT_GT(highlighted("C"), 0);
+    EXPECT_EQ(0, highlighted("B"));
+    m_parent.SetFocus();
+    orvane_test::PumpUntilIdle(50);
+    EXPECT_EQ(0, highlighted("A"));
+    EXPECT_EQ(0, highlighted("C"));
+    m_tree.SetFocus();
+    orvane_test::PumpUntilIdle(50);
+    EXPECT_GT(highlighted("A"), 0);
 }
 
 } // namespace

@@ -1,11 +1,10 @@
 // Test harness of the tree family: a parent window that records the notifications it
-// receives (with IsEmulatedNotify at that moment) as a compact trace, a tree that
-// exposes the protected operations, and a fixture that builds named items.
+// receives (with IsEmulatedNotify at that moment) as a compact trace, a tree that exposes
+// the protected operations, and a fixture that builds named items and drives presses.
 //
 // Trace of one notification: [*]code[:-old][+new]
 //   *    sent by the control itself (IsEmulatedNotify was TRUE during the call)
-//   code ing, ed (selection changing/changed), click, rclick, drag, rdrag,
-//        expanding, expanded
+//   code ing, ed (selection changing/changed), click, rclick, drag, rdrag, expanding, expanded
 //   -X   item X in itemOld, +Y item Y in itemNew (by item text)
 #pragma once
 
@@ -15,31 +14,39 @@
 #include <gtest/gtest.h>
 
 #include "CMultiTree.h"
+#include "Input.h"
+#include "OrvaneLibrary.h"
 
 #include <map>
+#include <sstream>
 #include <string>
 #include <vector>
 
 namespace tree_test {
 
 // The small tree most cases use: one item a line, indented by depth.
-inline const char* const kSmallTree =
-    "A\n"
-    " A1\n"
-    " A2\n"
-    "  A2a\n"
-    "B\n"
-    "C\n"
-    " C1\n"
-    "D\n"
-    "E\n";
+inline const char* const kSmallTree = "A\n A1\n A2\n  A2a\nB\nC\n C1\nD\nE\n";
+
+inline std::string ItemName(const CTreeCtrl& tree, HTREEITEM hItem)
+{
+    const CString text = hItem != NULL ? tree.GetItemText(hItem) : CString();
+    return std::string(static_cast<LPCTSTR>(text), static_cast<LPCTSTR>(text) + text.GetLength());
+}
+
+// Names of the selected items in visible order, separated by blanks.
+inline std::string SelectedNames(const CMultiTree& tree)
+{
+    std::string names;
+    for (HTREEITEM h = tree.GetRootItem(); h != NULL; h = tree.GetNextVisibleItem(h))
+        if (tree.IsSelected(h))
+            names += (names.empty() ? "" : " ") + ItemName(tree, h);
+    return names;
+}
 
 class CTestTree : public CMultiTree
 {
 public:
-    using CMultiTree::DoBanding;
     using CMultiTree::OnButtonDown;
-    using CMultiTree::SelectAllIgnore;
     using CMultiTree::UpdateSelectionForRect;
 
     HTREEITEM Anchor() const { return m_hAnchorItem; }
@@ -47,7 +54,10 @@ public:
 
     // "+A -B": OnItemSelected calls in order.
     std::string m_hookTrace;
-    void OnItemSelected(HTREEITEM hItem, bool bSelected) override;
+    void OnItemSelected(HTREEITEM hItem, bool bSelected) override
+    {
+        m_hookTrace += (m_hookTrace.empty() ? "" : " ") + std::string(bSelected ? "+" : "-") + ItemName(*this, hItem);
+    }
 };
 
 class CRecordingParent : public CWnd
@@ -57,100 +67,281 @@ public:
     {
         UINT code;
         bool emulated;
-        std::string oldName;
-        std::string newName;
+        std::string oldName, newName;
         UINT newMask;
         LPARAM newParam;
         POINT ptDrag;
-        UINT action;
     };
 
-    BOOL CreateParent(int x, int y, int cx, int cy);
-
-    std::string Trace() const;
+    std::string Trace() const
+    {
+        std::string trace;
+        for (const Record& r : m_records)
+        {
+            trace += (trace.empty() ? "" : " ") + std::string(r.emulated ? "*" : "") + CodeName(r.code);
+            if (!r.oldName.empty() || !r.newName.empty())
+                trace += ":" + (r.oldName.empty() ? "" : "-" + r.oldName) + (r.newName.empty() ? "" : "+" + r.newName);
+        }
+        return trace;
+    }
     void ClearTrace() { m_records.clear(); }
-    const std::vector<Record>& Records() const { return m_records; }
-    const Record* Last(UINT code) const;
+    const Record* Last(UINT code) const
+    {
+        for (auto it = m_records.rbegin(); it != m_records.rend(); ++it)
+            if (it->code == code)
+                return &*it;
+        return nullptr;
+    }
 
     CTestTree* m_pTree = nullptr;
-    HTREEITEM m_hVeto = NULL;         // TVN_SELCHANGINGW naming this item is refused
-    std::vector<std::string> m_selectionAtClick;   // Selected() seen at each NM_CLICK
-    // A posted kProbeMessage records the selection when a press loop dispatches it:
-    // the state between the press and the release.
+    HTREEITEM m_hVeto = NULL;                       // TVN_SELCHANGINGW naming this item is refused
+    std::vector<std::string> m_selectionAtClick;    // the selection at each NM_CLICK
+    // A posted kProbeMessage records the selection when a press loop dispatches it: the
+    // state between the press and the release. A posted kCaptureMessage gives the mouse
+    // capture to the window in wParam.
     static constexpr UINT kProbeMessage = WM_APP + 7;
+    static constexpr UINT kCaptureMessage = WM_APP + 8;
     std::vector<std::string> m_probes;
     void PostProbe() { PostMessage(kProbeMessage); }
-    // A posted kCaptureMessage gives the mouse capture to the window in wParam when a
-    // press loop dispatches it.
-    static constexpr UINT kCaptureMessage = WM_APP + 8;
 
 protected:
-    BOOL OnNotify(WPARAM wParam, LPARAM lParam, LRESULT* pResult) override;
-    LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
+    static const char* CodeName(UINT code)
+    {
+        switch (code)
+        {
+        case TVN_SELCHANGINGW: return "ing";
+        case TVN_SELCHANGEDW: return "ed";
+        case NM_CLICK: return "click";
+        case NM_RCLICK: return "rclick";
+        case TVN_BEGINDRAGW: return "drag";
+        case TVN_BEGINRDRAGW: return "rdrag";
+        case TVN_ITEMEXPANDINGW: return "expanding";
+        case TVN_ITEMEXPANDEDW: return "expanded";
+        default: return nullptr;
+        }
+    }
+    BOOL OnNotify(WPARAM wParam, LPARAM lParam, LRESULT* pResult) override
+    {
+        const NMHDR* pHdr = reinterpret_cast<const NMHDR*>(lParam);
+        if (m_pTree != nullptr && pHdr->hwndFrom == m_pTree->m_hWnd && CodeName(pHdr->code) != nullptr)
+        {
+            Record r = { pHdr->code, m_pTree->IsEmulatedNotify() != FALSE };
+            if (pHdr->code != NM_CLICK && pHdr->code != NM_RCLICK)
+            {
+                const NMTREEVIEW* pNM = reinterpret_cast<const NMTREEVIEW*>(lParam);
+                r.oldName = ItemName(*m_pTree, pNM->itemOld.hItem);
+                r.newName = ItemName(*m_pTree, pNM->itemNew.hItem);
+                r.newMask = pNM->itemNew.mask;
+                r.newParam = pNM->itemNew.lParam;
+                r.ptDrag = pNM->ptDrag;
+                if (pHdr->code == TVN_SELCHANGINGW && m_hVeto != NULL
+                    && (pNM->itemNew.hItem == m_hVeto || pNM->itemOld.hItem == m_hVeto))
+                {
+                    m_records.push_back(r);
+                    *pResult = TRUE;
+                    return TRUE;
+                }
+            }
+            else
+                m_selectionAtClick.push_back(SelectedNames(*m_pTree));
+            m_records.push_back(r);
+        }
+        // The framework reflects the notification to the tree first (collapse handling).
+        return CWnd::OnNotify(wParam, lParam, pResult);
+    }
+    LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override
+    {
+        if (message == kProbeMessage)
+            m_probes.push_back(m_pTree != nullptr ? SelectedNames(*m_pTree) : std::string());
+        else if (message == kCaptureMessage)
+            ::SetCapture(reinterpret_cast<HWND>(wParam));
+        else
+            return CWnd::WindowProc(message, wParam, lParam);
+        return 0;
+    }
 
 private:
     std::vector<Record> m_records;
 };
 
-// Bounds a press: the press loops end when the control loses the capture, so a loop
-// still running after five seconds has the capture taken away, and the test fails.
+// Bounds a press: the press loops end when the control loses the capture, so a loop still
+// running after five seconds has the capture taken away, and the test fails.
 class PressWatchdog
 {
 public:
-    PressWatchdog();
-    ~PressWatchdog();
-    PressWatchdog(const PressWatchdog&) = delete;
-    PressWatchdog& operator=(const PressWatchdog&) = delete;
+    PressWatchdog() : m_timer(::SetTimer(NULL, 0, 5000, &Expired)) { Fired() = false; }
+    ~PressWatchdog()
+    {
+        ::KillTimer(NULL, m_timer);
+        EXPECT_FALSE(Fired()) << "a press loop did not end by itself";
+    }
 
 private:
+    static bool& Fired()
+    {
+        static bool fired = false;
+        return fired;
+    }
+    static void CALLBACK Expired(HWND, UINT, UINT_PTR id, DWORD)
+    {
+        ::KillTimer(NULL, id);
+        Fired() = true;
+        ::ReleaseCapture();
+    }
     UINT_PTR m_timer;
 };
-
-// Names of the selected items in visible order, separated by blanks.
-std::string SelectedNames(const CMultiTree& tree);
-std::string ItemName(const CTreeCtrl& tree, HTREEITEM hItem);
 
 class TreeFixture : public testing::Test
 {
 protected:
-    static void SetUpTestSuite();
+    static constexpr DWORD kBaseStyle = WS_CHILD | WS_VISIBLE | WS_BORDER | TVS_HASBUTTONS | TVS_HASLINES
+        | TVS_LINESATROOT | TVS_SHOWSELALWAYS;
 
-    void SetUp() override;
-    void TearDown() override;
+    static void SetUpTestSuite() { orvane_test::LoadLibraryOnce(); }
+    void SetUp() override
+    {
+        ASSERT_TRUE(CreateParent());
+        m_parent.m_pTree = &m_tree;
+        CreateTree();
+    }
+    // The tree's top-level parent window (again, after a test destroyed it).
+    bool CreateParent()
+    {
+        return m_parent.CreateEx(0, AfxRegisterWndClass(0, ::LoadCursor(NULL, IDC_ARROW), HBRUSH(COLOR_WINDOW + 1)),
+                                 _T("tree test"), WS_POPUP | WS_VISIBLE | WS_CLIPCHILDREN, 60, 60, 320, 420, NULL, NULL) != FALSE;
+    }
+    void TearDown() override
+    {
+        m_tree.DestroyWindow();
+        m_parent.DestroyWindow();
+        orvane_test::PumpUntilIdle(50);
+    }
 
     // Re-creates the tree with extra styles (the default is lines, buttons, lines at root).
-    void CreateTree(DWORD extraStyle = 0);
-    // One item per line, one leading blank per level; every parent is expanded.
-    void Build(const char* spec);
+    void CreateTree(DWORD extraStyle = 0)
+    {
+        if (m_tree.m_hWnd != NULL)
+            m_tree.DestroyWindow();
+        m_items.clear();
+        CRect rc;
+        m_parent.GetClientRect(&rc);
+        rc.DeflateRect(10, 10);
+        ASSERT_TRUE(m_tree.Create(kBaseStyle | extraStyle, rc, &m_parent, 1234));
+    }
+    // One item per line, one leading blank per level, item data from 100; every parent expanded.
+    void Build(const char* spec)
+    {
+        std::vector<HTREEITEM> parents;   // parents[level]: the last item at that level
+        std::istringstream lines(spec);
+        LPARAM data = 100;
+        m_tree.SetRedraw(FALSE);
+        for (std::string line; std::getline(lines, line);)
+        {
+            const size_t level = line.find_first_not_of(' ');
+            const std::string name = line.substr(level);
+            HTREEITEM h = m_tree.InsertItem(TVIF_TEXT | TVIF_PARAM, CString(name.c_str()), 0, 0, 0, 0, data++,
+                                            level == 0 ? TVI_ROOT : parents.at(level - 1), TVI_LAST);
+            m_items[name] = h;
+            parents.resize(level + 1);
+            parents[level] = h;
+        }
+        for (auto& entry : m_items)
+            if (m_tree.ItemHasChildren(entry.second))
+                m_tree.Expand(entry.second, TVE_EXPAND);
+        m_tree.SetRedraw(TRUE);
+        m_tree.UpdateWindow();
+        m_parent.ClearTrace();
+    }
     // count flat items "I0".."I<count-1>".
-    void BuildFlat(int count);
+    void BuildFlat(int count)
+    {
+        std::string spec;
+        for (int i = 0; i < count; ++i)
+            spec += "I" + std::to_string(i) + "\n";
+        Build(spec.c_str());
+    }
 
-    HTREEITEM Item(const std::string& name) const;
+    HTREEITEM Item(const std::string& name) const
+    {
+        auto it = m_items.find(name);
+        return it == m_items.end() ? NULL : it->second;
+    }
     std::string Selected() const { return SelectedNames(m_tree); }
     std::string Caret() const { return ItemName(m_tree, m_tree.GetSelectedItem()); }
 
-    // Puts the item's state directly (no notification) to arrange a starting state.
-    void Arrange(const std::vector<std::string>& selected, const std::string& caret);
+    // Puts the items' state directly (no notification) to arrange a starting state: the
+    // caret ("" for none), the selected items (blank-separated), no anchor, empty traces.
+    void Arrange(const std::string& selected, const std::string& caret)
+    {
+        m_tree.CTreeCtrl::SelectItem(Item(caret));
+        for (auto& entry : m_items)
+        {
+            const bool want = (" " + selected + " ").find(" " + entry.first + " ") != std::string::npos;
+            m_tree.CTreeCtrl::SetItemState(entry.second, want ? TVIS_SELECTED : 0, TVIS_SELECTED);
+        }
+        m_tree.SetAnchor(NULL);
+        m_tree.UpdateWindow();
+        m_parent.ClearTrace();
+        m_parent.m_selectionAtClick.clear();
+        m_parent.m_probes.clear();
+        m_tree.m_hookTrace.clear();
+    }
 
     // Mouse, in client coordinates of the tree.
-    CPoint LabelPoint(const std::string& name) const;
-    CPoint RightOfLabel(const std::string& name) const;
+    CPoint LabelPoint(const std::string& name) const
+    {
+        CRect rc;
+        EXPECT_TRUE(m_tree.GetItemRect(Item(name), &rc, TRUE)) << name;
+        return rc.CenterPoint();
+    }
+    CPoint RightOfLabel(const std::string& name) const { return LabelPoint(name) + CSize(LabelWidth(name) / 2 + 20, 0); }
+    int LabelWidth(const std::string& name) const
+    {
+        CRect rc;
+        m_tree.GetItemRect(Item(name), &rc, TRUE);
+        return rc.Width();
+    }
     // A point where the tree's hit test reports hitFlag (TVHT_ONITEMBUTTON, ...) for the item.
-    CPoint PointWithHit(const std::string& name, UINT hitFlag) const;
-    void PointCursorAt(CPoint client);
-    void PostMove(CPoint pt, UINT keys = MK_LBUTTON);
-    void PostButtonUp(CPoint pt, UINT keys = 0, UINT message = WM_LBUTTONUP);
-    void SendButtonDown(CPoint pt, UINT keys = MK_LBUTTON);
-    // A click: button-up queued, then the button-down sent.
-    void Click(CPoint pt, UINT keys = 0);
+    CPoint PointWithHit(const std::string& name, UINT hitFlag) const
+    {
+        const CPoint label = LabelPoint(name);
+        for (int x = 0; x < label.x; ++x)
+        {
+            UINT flags = 0;
+            if (m_tree.HitTest(CPoint(x, label.y), &flags) == Item(name) && (flags & hitFlag))
+                return CPoint(x + 2, label.y);   // a little inside the area
+        }
+        ADD_FAILURE() << "no hit area " << hitFlag << " on " << name;
+        return CPoint(0, label.y);
+    }
+    void PointCursorAt(CPoint client)
+    {
+        m_tree.ClientToScreen(&client);
+        ::SetCursorPos(client.x, client.y);
+        orvane_test::PumpUntilIdle(50);
+    }
+    void PostMove(CPoint pt, UINT keys = MK_LBUTTON) { m_tree.PostMessage(WM_MOUSEMOVE, keys, MAKELPARAM(pt.x, pt.y)); }
+    void PostButtonUp(CPoint pt, UINT keys = 0, UINT message = WM_LBUTTONUP)
+    {
+        m_tree.PostMessage(message, keys, MAKELPARAM(pt.x, pt.y));
+    }
+    void SendButtonDown(CPoint pt, UINT keys = MK_LBUTTON)
+    {
+        PressWatchdog watchdog;
+        m_tree.SendMessage(WM_LBUTTONDOWN, keys, MAKELPARAM(pt.x, pt.y));
+    }
+    // A click: the button-up queued, then the button-down sent.
+    void Click(CPoint pt, UINT keys = 0)
+    {
+        PointCursorAt(pt);
+        PostButtonUp(pt, keys & ~(MK_LBUTTON | MK_RBUTTON));
+        SendButtonDown(pt, keys | MK_LBUTTON);
+        orvane_test::PumpUntilIdle(50);
+    }
 
     CRecordingParent m_parent;
     CTestTree m_tree;
     std::map<std::string, HTREEITEM> m_items;
-
-    static constexpr UINT kTreeId = 1234;
-    static constexpr DWORD kBaseStyle = WS_CHILD | WS_VISIBLE | WS_BORDER | TVS_HASBUTTONS | TVS_HASLINES
-        | TVS_LINESATROOT | TVS_SHOWSELALWAYS;
 };
 
 } // namespace tree_test

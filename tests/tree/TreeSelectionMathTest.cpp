@@ -75,20 +75,16 @@ const PlanCase kPlanCases[] = {
     { "EmptyMask", S, 0, false, false, false, "", 0, 0 },
 };
 
-class PlanStateRequestTest : public testing::TestWithParam<PlanCase> {};
-
-TEST_P(PlanStateRequestTest, Steps)
+TEST(PlanStateRequest, Steps)
 {
-    const PlanCase& c = GetParam();
-    StateRequest r{ c.state, c.mask, c.itemIsCaret, c.caretSelected, c.itemSelected };
-    const StatePlan plan = PlanStateRequest(r);
-    EXPECT_EQ(c.steps, Steps(plan));
-    EXPECT_EQ(c.restState, plan.state);
-    EXPECT_EQ(c.restMask, plan.mask);
+    for (const PlanCase& c : kPlanCases)
+    {
+        const StatePlan plan = PlanStateRequest(StateRequest{ c.state, c.mask, c.itemIsCaret, c.caretSelected, c.itemSelected });
+        EXPECT_EQ(c.steps, Steps(plan)) << c.name;
+        EXPECT_EQ(c.restState, plan.state) << c.name;
+        EXPECT_EQ(c.restMask, plan.mask) << c.name;
+    }
 }
-
-INSTANTIATE_TEST_SUITE_P(Table, PlanStateRequestTest, testing::ValuesIn(kPlanCases),
-    [](const testing::TestParamInfo<PlanCase>& info) { return std::string(info.param.name); });
 
 // ---------------------------------------------------------------------------------
 // RangeSelectionWalk: items as letters, endpoints in upper case; the result marks
@@ -118,28 +114,20 @@ const RangeCase kRangeCases[] = {
     { "EmptyTree", "", true, false, "" },
 };
 
-class RangeSelectionWalkTest : public testing::TestWithParam<RangeCase> {};
-
-TEST_P(RangeSelectionWalkTest, Marks)
+TEST(RangeSelectionWalk, Marks)
 {
-    const RangeCase& c = GetParam();
-    const std::string items = c.items;
-    RangeSelectionWalk walk(c.only, c.singleItem);
-    std::string marks;
-    for (char ch : items)
+    for (const RangeCase& c : kRangeCases)
     {
-        switch (walk.Next(ch >= 'A' && ch <= 'Z'))
+        RangeSelectionWalk walk(c.only, c.singleItem);
+        std::string marks;
+        for (char ch : std::string(c.items))
         {
-        case RangeStep::Select: marks += 's'; break;
-        case RangeStep::Deselect: marks += 'd'; break;
-        case RangeStep::Keep: marks += '.'; break;
+            const RangeStep step = walk.Next(ch >= 'A' && ch <= 'Z');
+            marks += step == RangeStep::Select ? 's' : step == RangeStep::Deselect ? 'd' : '.';
         }
+        EXPECT_EQ(c.expected, marks) << c.name;
     }
-    EXPECT_EQ(c.expected, marks);
 }
-
-INSTANTIATE_TEST_SUITE_P(Table, RangeSelectionWalkTest, testing::ValuesIn(kRangeCases),
-    [](const testing::TestParamInfo<RangeCase>& info) { return std::string(info.param.name); });
 
 // ---------------------------------------------------------------------------------
 // Presses
@@ -168,27 +156,22 @@ const PressCase kPressCases[] = {
     { "NoItemButFlags", false, 0x0004, true, false, PressRoute::Band },
 };
 
-class ClassifyPressTest : public testing::TestWithParam<PressCase> {};
-
-TEST_P(ClassifyPressTest, Route)
+TEST(ClassifyPress, Route)
 {
-    const PressCase& c = GetParam();
-    EXPECT_EQ(static_cast<int>(c.expected), static_cast<int>(ClassifyPress(c.hitItem, c.flags, c.left, c.checkBoxes)));
+    for (const PressCase& c : kPressCases)
+        EXPECT_EQ(int(c.expected), int(ClassifyPress(c.hitItem, c.flags, c.left, c.checkBoxes))) << c.name;
 }
-
-INSTANTIATE_TEST_SUITE_P(Table, ClassifyPressTest, testing::ValuesIn(kPressCases),
-    [](const testing::TestParamInfo<PressCase>& info) { return std::string(info.param.name); });
 
 TEST(PreSelection, ByButtonAndKeys)
 {
-    EXPECT_EQ(static_cast<int>(PreSelection::ShiftRange), static_cast<int>(ClassifyPreSelection(true, MK_SHIFT)));
-    EXPECT_EQ(static_cast<int>(PreSelection::ShiftRange), static_cast<int>(ClassifyPreSelection(true, MK_SHIFT | MK_CONTROL)));
-    EXPECT_EQ(static_cast<int>(PreSelection::ClearAnchor), static_cast<int>(ClassifyPreSelection(true, MK_CONTROL)));
-    EXPECT_EQ(static_cast<int>(PreSelection::SelectItem), static_cast<int>(ClassifyPreSelection(true, MK_LBUTTON)));
-    EXPECT_EQ(static_cast<int>(PreSelection::SelectKeepAnchor), static_cast<int>(ClassifyPreSelection(false, MK_RBUTTON)));
-    EXPECT_EQ(static_cast<int>(PreSelection::Nothing), static_cast<int>(ClassifyPreSelection(false, MK_SHIFT)));
-    EXPECT_EQ(static_cast<int>(PreSelection::Nothing), static_cast<int>(ClassifyPreSelection(false, MK_SHIFT | MK_CONTROL)));
-    EXPECT_EQ(static_cast<int>(PreSelection::SetAnchor), static_cast<int>(ClassifyPreSelection(false, MK_CONTROL)));
+    const struct { bool left; UINT keys; PreSelection expected; } cases[] = {
+        { true, MK_SHIFT, PreSelection::ShiftRange },          { true, MK_SHIFT | MK_CONTROL, PreSelection::ShiftRange },
+        { true, MK_CONTROL, PreSelection::ClearAnchor },       { true, MK_LBUTTON, PreSelection::SelectItem },
+        { false, MK_RBUTTON, PreSelection::SelectKeepAnchor }, { false, MK_SHIFT, PreSelection::Nothing },
+        { false, MK_SHIFT | MK_CONTROL, PreSelection::Nothing }, { false, MK_CONTROL, PreSelection::SetAnchor },
+    };
+    for (const auto& c : cases)
+        EXPECT_EQ(int(c.expected), int(ClassifyPreSelection(c.left, c.keys))) << c.left << " keys " << c.keys;
 }
 
 TEST(PlanClick, ByButtonKeysAndState)
@@ -270,16 +253,11 @@ const TouchCase kTouchCases[] = {
     { "EmptyItem", { 0, 0, 100, 100 }, { 20, 20, 20, 40 }, false },
 };
 
-class BandTouchesTest : public testing::TestWithParam<TouchCase> {};
-
-TEST_P(BandTouchesTest, Touches)
+TEST(BandTouches, Touches)
 {
-    const TouchCase& c = GetParam();
-    EXPECT_EQ(c.expected, BandTouches(c.band, c.item));
+    for (const TouchCase& c : kTouchCases)
+        EXPECT_EQ(c.expected, BandTouches(c.band, c.item)) << c.name;
 }
-
-INSTANTIATE_TEST_SUITE_P(Table, BandTouchesTest, testing::ValuesIn(kTouchCases),
-    [](const testing::TestParamInfo<TouchCase>& info) { return std::string(info.param.name); });
 
 TEST(AutoScroll, OneLinePerAxisOutsideTheClientArea)
 {
@@ -325,16 +303,11 @@ const BandCase kBandCases[] = {
     { "OutsideNeither", false, false, false, MK_CONTROL, BandStep::Nothing },
 };
 
-class DecideBandStepTest : public testing::TestWithParam<BandCase> {};
-
-TEST_P(DecideBandStepTest, Step)
+TEST(DecideBandStep, Step)
 {
-    const BandCase& c = GetParam();
-    EXPECT_EQ(static_cast<int>(c.expected), static_cast<int>(DecideBandStep(c.touches, c.selected, c.inSnapshot, c.keys)));
+    for (const BandCase& c : kBandCases)
+        EXPECT_EQ(int(c.expected), int(DecideBandStep(c.touches, c.selected, c.inSnapshot, c.keys))) << c.name;
 }
-
-INSTANTIATE_TEST_SUITE_P(Table, DecideBandStepTest, testing::ValuesIn(kBandCases),
-    [](const testing::TestParamInfo<BandCase>& info) { return std::string(info.param.name); });
 
 TEST(SelectionSnapshot, AddContainsRemove)
 {

@@ -1,7 +1,8 @@
-// Number grammar as plain functions:
-//  - long: every result code with its error position, for decimal, binary and hexadecimal text;
-//    32-bit patterns of unsigned prefixed text, magnitudes of signed ones; blanks and signs;
-//  - double: every result code, correct rounding at the ends of the type, subnormals, -0;
+// Number grammar as plain functions, at the boundaries the random differential test
+// (grammar_random_test.cpp) seldom reaches:
+//  - long: the ends of the type, 32-bit patterns of unsigned prefixed text and magnitudes of
+//    signed ones, the words, an explicit length, a NULL text;
+//  - double: the ends of the type, rounding to infinity and to zero, subnormals, huge exponents;
 //  - base detection; formatting of long (three bases) and double, and the round trip back;
 //  - the printf conversion letters.
 #include <gtest/gtest.h>
@@ -27,102 +28,43 @@ struct LongCase
     int errorPos;   // checked always (0 unless a syntax error)
 };
 
-std::string CaseName(const testing::TestParamInfo<LongCase>& info) { return info.param.name; }
-
-void PrintTo(const LongCase& c, std::ostream* os)
-{
-    *os << c.name << " " << testing::PrintToString(std::wstring(c.text));
-}
-
 const LongCase kLongCases[] = {
-    // decimal
-    { "Zero", L"0", KVT_CONVERT_OK, 0, 0 },
-    { "Plain", L"123", KVT_CONVERT_OK, 123, 0 },
-    { "Negative", L"-123", KVT_CONVERT_OK, -123, 0 },
-    { "PlusSign", L"+123", KVT_CONVERT_OK, 123, 0 },
-    { "LeadingZeros", L"007", KVT_CONVERT_OK, 7, 0 },
-    { "NegativeZero", L"-0", KVT_CONVERT_OK, 0, 0 },
-    { "BlanksAround", L"  42\t ", KVT_CONVERT_OK, 42, 0 },
     { "Max", L"2147483647", KVT_CONVERT_OK, LONG_MAX, 0 },
     { "Min", L"-2147483648", KVT_CONVERT_OK, LONG_MIN, 0 },
     { "MaxManyZeros", L"0000000000002147483647", KVT_CONVERT_OK, LONG_MAX, 0 },
     { "AboveMax", L"2147483648", KVT_CONVERT_OVERFLOW, 0, 0 },
-    { "AboveMaxPlus", L"+2147483648", KVT_CONVERT_OVERFLOW, 0, 0 },
     { "FarAboveMax", L"99999999999999999999999999", KVT_CONVERT_OVERFLOW, 0, 0 },
     { "BelowMin", L"-2147483649", KVT_CONVERT_UNDERFLOW, 0, 0 },
-    { "FarBelowMin", L"-99999999999999999999999999", KVT_CONVERT_UNDERFLOW, 0, 0 },
-    { "Empty", L"", KVT_CONVERT_NOT_A_NUMBER, 0, 0 },
-    { "OnlyBlanks", L" \t ", KVT_CONVERT_NOT_A_NUMBER, 0, 0 },
-    { "LoneMinus", L"-", KVT_CONVERT_NOT_A_NUMBER, 0, 0 },
-    { "LonePlusBlanks", L" + ", KVT_CONVERT_NOT_A_NUMBER, 0, 0 },
     { "NanWord", L"nan", KVT_CONVERT_NOT_A_NUMBER, 0, 0 },
     { "InfWord", L"-Inf", KVT_CONVERT_NOT_A_NUMBER, 0, 0 },
     { "InfinityWord", L" INFINITY ", KVT_CONVERT_NOT_A_NUMBER, 0, 0 },
-    { "LetterInside", L"12a4", KVT_CONVERT_SYNTAX_ERROR, 0, 2 },
-    { "BlankInside", L"1 2", KVT_CONVERT_SYNTAX_ERROR, 0, 1 },
-    { "BlankAfterSign", L"- 5", KVT_CONVERT_SYNTAX_ERROR, 0, 1 },
-    { "TwoSigns", L"--1", KVT_CONVERT_SYNTAX_ERROR, 0, 1 },
-    { "Point", L"1.5", KVT_CONVERT_SYNTAX_ERROR, 0, 1 },
-    { "Exponent", L"1e3", KVT_CONVERT_SYNTAX_ERROR, 0, 1 },
-    { "Hash", L"#5", KVT_CONVERT_SYNTAX_ERROR, 0, 0 },
-    { "Dollar", L"$FF", KVT_CONVERT_SYNTAX_ERROR, 0, 0 },
-    { "IndexCountsBlanks", L"  x", KVT_CONVERT_SYNTAX_ERROR, 0, 2 },
-    { "SyntaxBeforeRange", L"99999999999#", KVT_CONVERT_SYNTAX_ERROR, 0, 11 },
     { "WordPrefix", L"info", KVT_CONVERT_SYNTAX_ERROR, 0, 0 },
-    { "DecimalB", L"1b", KVT_CONVERT_SYNTAX_ERROR, 0, 1 },
-    { "DoubleZeroPrefix", L"00x1", KVT_CONVERT_SYNTAX_ERROR, 0, 2 },
-    // binary
-    { "BinZero", L"0b0", KVT_CONVERT_OK, 0, 0 },
-    { "BinTen", L"0b1010", KVT_CONVERT_OK, 10, 0 },
-    { "BinUpperPrefix", L"0B11", KVT_CONVERT_OK, 3, 0 },
-    { "BinRoadOfOneEvent", L"0b102", KVT_CONVERT_SYNTAX_ERROR, 0, 4 },
-    { "BinDigitTwoFirst", L"0b2", KVT_CONVERT_SYNTAX_ERROR, 0, 2 },
-    { "BinBlankAfterPrefix", L"0b 1", KVT_CONVERT_SYNTAX_ERROR, 0, 2 },
-    { "BinLonePrefix", L"0b", KVT_CONVERT_NOT_A_NUMBER, 0, 0 },
-    { "BinLoneSignedPrefix", L"-0b", KVT_CONVERT_NOT_A_NUMBER, 0, 0 },
+    { "SyntaxBeforeRange", L"99999999999#", KVT_CONVERT_SYNTAX_ERROR, 0, 11 },
     { "BinAllOnes", L"0b11111111111111111111111111111111", KVT_CONVERT_OK, -1, 0 },
     { "BinTopBit", L"0b10000000000000000000000000000000", KVT_CONVERT_OK, LONG_MIN, 0 },
     { "Bin33Bits", L"0b100000000000000000000000000000000", KVT_CONVERT_OVERFLOW, 0, 0 },
     { "BinLeadingZeros", L"0b0000000000000000000000000000000000000001", KVT_CONVERT_OK, 1, 0 },
-    { "BinNegative", L"-0b101", KVT_CONVERT_OK, -5, 0 },
-    { "BinPlus", L"+0b101", KVT_CONVERT_OK, 5, 0 },
     { "BinPlusTopBit", L"+0b10000000000000000000000000000000", KVT_CONVERT_OVERFLOW, 0, 0 },
-    // hexadecimal
-    { "HexZero", L"0x0", KVT_CONVERT_OK, 0, 0 },
-    { "HexA", L"0xA", KVT_CONVERT_OK, 10, 0 },
-    { "HexLower", L"0xff", KVT_CONVERT_OK, 255, 0 },
-    { "HexMixedCase", L"0XfF", KVT_CONVERT_OK, 255, 0 },
     { "HexAllOnes", L"0xFFFFFFFF", KVT_CONVERT_OK, -1, 0 },
     { "HexTopBit", L"0x80000000", KVT_CONVERT_OK, LONG_MIN, 0 },
-    { "HexMax", L"0x7FFFFFFF", KVT_CONVERT_OK, LONG_MAX, 0 },
     { "Hex33Bits", L"0x100000000", KVT_CONVERT_OVERFLOW, 0, 0 },
     { "HexNegativeMin", L"-0x80000000", KVT_CONVERT_OK, LONG_MIN, 0 },
     { "HexNegativeBelowMin", L"-0x80000001", KVT_CONVERT_UNDERFLOW, 0, 0 },
     { "HexPlusTopBit", L"+0x80000000", KVT_CONVERT_OVERFLOW, 0, 0 },
     { "HexPlusMax", L"+0x7FFFFFFF", KVT_CONVERT_OK, LONG_MAX, 0 },
-    { "HexBadDigit", L"0xG", KVT_CONVERT_SYNTAX_ERROR, 0, 2 },
-    { "HexBadDigitAfterBlank", L" 0x1g", KVT_CONVERT_SYNTAX_ERROR, 0, 4 },
-    { "HexSignAfterPrefix", L"0x-1", KVT_CONVERT_SYNTAX_ERROR, 0, 2 },
-    { "HexLonePrefix", L"0x", KVT_CONVERT_NOT_A_NUMBER, 0, 0 },
-    { "HexTrailingBlank", L"0x1F ", KVT_CONVERT_OK, 31, 0 },
 };
 
-class LongGrammar : public testing::TestWithParam<LongCase> {};
-
-TEST_P(LongGrammar, Parses)
+TEST(LongGrammar, BoundaryRows)
 {
-    const LongCase& c = GetParam();
-    long value = 12345;
-    int errorPos = -99;
-    EXPECT_EQ(c.code, KvtParseLong(c.text, -1, value, errorPos));
-    EXPECT_EQ(c.errorPos, errorPos);
-    if (c.code == KVT_CONVERT_OK)
-        EXPECT_EQ(c.value, value);
-    else
-        EXPECT_EQ(12345, value) << "a failed conversion must leave the value alone";
+    for (const LongCase& c : kLongCases)
+    {
+        long value = 12345;
+        int errorPos = -99;
+        EXPECT_EQ(c.code, KvtParseLong(c.text, -1, value, errorPos)) << c.name;
+        EXPECT_EQ(c.errorPos, errorPos) << c.name;
+        EXPECT_EQ(c.code == KVT_CONVERT_OK ? c.value : 12345, value) << c.name << ": a failed conversion leaves the value";
+    }
 }
-
-INSTANTIATE_TEST_SUITE_P(Table, LongGrammar, testing::ValuesIn(kLongCases), CaseName);
 
 struct DoubleCase
 {
@@ -133,36 +75,13 @@ struct DoubleCase
     int errorPos;
 };
 
-std::string DoubleCaseName(const testing::TestParamInfo<DoubleCase>& info) { return info.param.name; }
-
-void PrintTo(const DoubleCase& c, std::ostream* os)
-{
-    *os << c.name << " " << testing::PrintToString(std::wstring(c.text));
-}
-
 const DoubleCase kDoubleCases[] = {
-    { "Zero", L"0", KVT_CONVERT_OK, 0.0, 0 },
-    { "Fraction", L"12.5", KVT_CONVERT_OK, 12.5, 0 },
-    { "Negative", L"-2.25", KVT_CONVERT_OK, -2.25, 0 },
-    { "PlusSign", L"+3", KVT_CONVERT_OK, 3.0, 0 },
-    { "TrailingPoint", L"1.", KVT_CONVERT_OK, 1.0, 0 },
-    { "LeadingPoint", L".5", KVT_CONVERT_OK, 0.5, 0 },
-    { "SignedLeadingPoint", L"-.5", KVT_CONVERT_OK, -0.5, 0 },
-    { "Exponent", L"1e3", KVT_CONVERT_OK, 1000.0, 0 },
-    { "UpperNegativeExponent", L"1E-3", KVT_CONVERT_OK, 0.001, 0 },
-    { "PlusExponent", L"1.5e+10", KVT_CONVERT_OK, 1.5e10, 0 },
-    { "BlanksAround", L" \t2.5  ", KVT_CONVERT_OK, 2.5, 0 },
-    { "LeadingZeros", L"007.50", KVT_CONVERT_OK, 7.5, 0 },
-    { "TenthRoundsCorrectly", L"0.1", KVT_CONVERT_OK, 0.1, 0 },
-    { "AboveEditRange", L"1e301", KVT_CONVERT_OK, 1e301, 0 },
     { "LargestDouble", L"1.7976931348623157e308", KVT_CONVERT_OK, DBL_MAX, 0 },
     { "LargestDoubleNegative", L"-1.7976931348623157e308", KVT_CONVERT_OK, -DBL_MAX, 0 },
     { "RoundsToInfinity", L"1.7976931348623159e308", KVT_CONVERT_OVERFLOW, 0.0, 0 },
-    { "Overflow", L"1e309", KVT_CONVERT_OVERFLOW, 0.0, 0 },
     { "Underflow", L"-1e309", KVT_CONVERT_UNDERFLOW, 0.0, 0 },
     { "HugeExponent", L"1e99999999999999999999", KVT_CONVERT_OVERFLOW, 0.0, 0 },
     { "HugeMantissaTinyExponent", L"100000000000000000000e-330", KVT_CONVERT_OK, 1e-310, 0 },
-    { "TooSmall", L"1e-400", KVT_CONVERT_PRECISION_LOSS, 0.0, 0 },
     { "TooSmallNegative", L"-1e-400", KVT_CONVERT_PRECISION_LOSS, 0.0, 0 },
     { "TinyExponentHuge", L"1e-99999999999999999999", KVT_CONVERT_PRECISION_LOSS, 0.0, 0 },
     { "TooSmallWithZeros", L"0.0001e-322", KVT_CONVERT_PRECISION_LOSS, 0.0, 0 },
@@ -171,59 +90,22 @@ const DoubleCase kDoubleCases[] = {
     { "RoundsUpToSubnormal", L"3e-324", KVT_CONVERT_OK, 4.9406564584124654e-324, 0 },
     { "ZeroHugeExponent", L"0e999999999999", KVT_CONVERT_OK, 0.0, 0 },
     { "ZerosTinyExponent", L"0.000e-99999", KVT_CONVERT_OK, 0.0, 0 },
-    { "Empty", L"", KVT_CONVERT_NOT_A_NUMBER, 0.0, 0 },
-    { "OnlyBlanks", L"   ", KVT_CONVERT_NOT_A_NUMBER, 0.0, 0 },
-    { "LoneMinus", L"-", KVT_CONVERT_NOT_A_NUMBER, 0.0, 0 },
-    { "LonePlus", L"+", KVT_CONVERT_NOT_A_NUMBER, 0.0, 0 },
-    { "LonePoint", L".", KVT_CONVERT_NOT_A_NUMBER, 0.0, 0 },
-    { "SignedLonePoint", L"-.", KVT_CONVERT_NOT_A_NUMBER, 0.0, 0 },
     { "NanWord", L"NaN", KVT_CONVERT_NOT_A_NUMBER, 0.0, 0 },
-    { "InfWord", L"-inf", KVT_CONVERT_NOT_A_NUMBER, 0.0, 0 },
     { "InfinityWord", L"+Infinity", KVT_CONVERT_NOT_A_NUMBER, 0.0, 0 },
-    { "ExponentWithoutDigits", L"1e", KVT_CONVERT_SYNTAX_ERROR, 0.0, 1 },
-    { "ExponentSignWithoutDigits", L"1e+", KVT_CONVERT_SYNTAX_ERROR, 0.0, 1 },
-    { "ExponentBadDigit", L"1e+x", KVT_CONVERT_SYNTAX_ERROR, 0.0, 3 },
-    { "ExponentLetterThenLetter", L"1ex", KVT_CONVERT_SYNTAX_ERROR, 0.0, 2 },
-    { "ExponentBlank", L"1e 5", KVT_CONVERT_SYNTAX_ERROR, 0.0, 2 },
-    { "OnlyExponent", L"e5", KVT_CONVERT_SYNTAX_ERROR, 0.0, 0 },
-    { "PointThenExponent", L".e5", KVT_CONVERT_SYNTAX_ERROR, 0.0, 1 },
-    { "TwoPoints", L"1.2.3", KVT_CONVERT_SYNTAX_ERROR, 0.0, 3 },
-    { "Comma", L"1,5", KVT_CONVERT_SYNTAX_ERROR, 0.0, 1 },
-    { "HexPrefix", L"0x1", KVT_CONVERT_SYNTAX_ERROR, 0.0, 1 },
-    { "BlankInside", L"1 5", KVT_CONVERT_SYNTAX_ERROR, 0.0, 1 },
-    { "BlankAfterSign", L"- 5", KVT_CONVERT_SYNTAX_ERROR, 0.0, 1 },
-    { "PointAfterExponent", L"1e5.", KVT_CONVERT_SYNTAX_ERROR, 0.0, 3 },
-    { "OtherExponentLetter", L"1d5", KVT_CONVERT_SYNTAX_ERROR, 0.0, 1 },
-    { "TwoSigns", L"++1", KVT_CONVERT_SYNTAX_ERROR, 0.0, 1 },
-    { "IndexCountsBlanks", L"  1#", KVT_CONVERT_SYNTAX_ERROR, 0.0, 3 },
     { "WordPrefix", L"infinite", KVT_CONVERT_SYNTAX_ERROR, 0.0, 0 },
     { "SyntaxBeforeRange", L"1e309x", KVT_CONVERT_SYNTAX_ERROR, 0.0, 5 },
 };
 
-class DoubleGrammar : public testing::TestWithParam<DoubleCase> {};
-
-TEST_P(DoubleGrammar, Parses)
+TEST(DoubleGrammar, BoundaryRows)
 {
-    const DoubleCase& c = GetParam();
-    double value = 12345.0;
-    int errorPos = -99;
-    EXPECT_EQ(c.code, KvtParseDouble(c.text, -1, value, errorPos));
-    EXPECT_EQ(c.errorPos, errorPos);
-    if (c.code == KVT_CONVERT_OK)
-        EXPECT_EQ(c.value, value);
-    else
-        EXPECT_EQ(12345.0, value) << "a failed conversion must leave the value alone";
-}
-
-INSTANTIATE_TEST_SUITE_P(Table, DoubleGrammar, testing::ValuesIn(kDoubleCases), DoubleCaseName);
-
-TEST(DoubleGrammarSign, NegativeZeroKeepsItsSign)
-{
-    double value = 1.0;
-    int errorPos = -1;
-    ASSERT_EQ(KVT_CONVERT_OK, KvtParseDouble(L"-0.0", -1, value, errorPos));
-    EXPECT_EQ(0.0, value);
-    EXPECT_TRUE(std::signbit(value)) << value;
+    for (const DoubleCase& c : kDoubleCases)
+    {
+        double value = 12345.0;
+        int errorPos = -99;
+        EXPECT_EQ(c.code, KvtParseDouble(c.text, -1, value, errorPos)) << c.name;
+        EXPECT_EQ(c.errorPos, errorPos) << c.name;
+        EXPECT_EQ(c.code == KVT_CONVERT_OK ? c.value : 12345.0, value) << c.name;
+    }
 }
 
 TEST(GrammarLength, ExplicitLengthStopsBeforeTheRest)
@@ -247,10 +129,8 @@ struct BaseCase
 };
 
 const BaseCase kBaseCases[] = {
-    { L"0b1", 2 },    { L"0B1", 2 },   { L"0b", 2 },     { L"-0b1", 2 },  { L" +0b102 ", 2 },
-    { L"0x1", 16 },   { L"0X", 16 },   { L"  +0x", 16 }, { L"-0xFF", 16 },
-    { L"10", 10 },    { L"b1", 10 },   { L"00b1", 10 },  { L"", 10 },     { L"0", 10 },
-    { L"x0b", 10 },   { L"- 0b1", 10 }, { L"#FF", 10 },  { L"0c1", 10 },
+    { L"0B1", 2 },  { L"0b", 2 },  { L" +0b102 ", 2 }, { L"0X", 16 },  { L"-0xFF", 16 },
+    { L"b1", 10 },  { L"00b1", 10 }, { L"", 10 },    { L"- 0b1", 10 }, { L"0c1", 10 },
 };
 
 TEST(NumberBase, FromPrefix)
@@ -270,38 +150,26 @@ const LongFormatCase kLongFormatCases[] = {
     { 0, 10, L"0" },
     { -1, 10, L"-1" },
     { LONG_MIN, 10, L"-2147483648" },
-    { LONG_MAX, 10, L"2147483647" },
     { 0, 2, L"0b0" },
     { 10, 2, L"0b1010" },
-    { 255, 2, L"0b11111111" },
     { -1, 2, L"0b11111111111111111111111111111111" },
-    { LONG_MIN, 2, L"0b10000000000000000000000000000000" },
     { 0, 16, L"0x0" },
-    { 10, 16, L"0xA" },
     { 255, 16, L"0xFF" },
-    { -1, 16, L"0xFFFFFFFF" },
     { LONG_MIN, 16, L"0x80000000" },
 };
 
-TEST(FormatLong, Table)
+TEST(FormatLong, TableAndABufferTooSmallGivesEmptyText)
 {
     for (const LongFormatCase& c : kLongFormatCases)
     {
         wchar_t buffer[KVT_NUMBER_TEXT_MAX];
-        int n = KvtFormatLong(c.value, c.base, buffer, KVT_NUMBER_TEXT_MAX);
+        EXPECT_EQ(int(std::wcslen(c.text)), KvtFormatLong(c.value, c.base, buffer, KVT_NUMBER_TEXT_MAX));
         EXPECT_EQ(std::wstring(c.text), std::wstring(buffer)) << c.value << " base " << c.base;
-        EXPECT_EQ(int(std::wcslen(c.text)), n);
     }
-}
-
-TEST(FormatLong, BufferTooSmallGivesEmptyText)
-{
-    wchar_t buffer[4] = { L'x', L'x', L'x', L'x' };
-    EXPECT_EQ(0, KvtFormatLong(255, 16, buffer, 4));  // "0xFF" needs 5 with the terminator
+    wchar_t buffer[5] = { L'x', L'x', L'x', L'x' };
+    EXPECT_EQ(0, KvtFormatLong(255, 16, buffer, 4));   // "0xFF" needs 5 with the terminator
     EXPECT_EQ(0, buffer[0]);
-    wchar_t fits[5];
-    EXPECT_EQ(4, KvtFormatLong(255, 16, fits, 5));
-    EXPECT_EQ(std::wstring(L"0xFF"), std::wstring(fits));
+    EXPECT_EQ(4, KvtFormatLong(255, 16, buffer, 5));
 }
 
 TEST(FormatLong, RoundTripInEveryBase)
@@ -336,7 +204,7 @@ TEST(FormatDouble, ShortestText)
         KvtFormatDouble(c.value, buffer, KVT_NUMBER_TEXT_MAX);
         EXPECT_EQ(std::wstring(c.text), std::wstring(buffer)) << c.value;
     }
-    wchar_t small[3];
+    wchar_t small[3] = { L'x' };
     EXPECT_EQ(0, KvtFormatDouble(12.5, small, 3));
     EXPECT_EQ(0, small[0]);
 }

@@ -1,6 +1,6 @@
 // The classes of the value-types module:
-//  - KVXString: GetAs and GetBase on the object (the texts the edits meet), Format, the grammar
-//    characters, IsFmtType, CString behaviour kept;
+//  - KVXString: GetAs and GetBase reach the grammar with the whole text (the grammar itself is
+//    tested in number_text_test.cpp), Format, the grammar characters, CString behaviour kept;
 //  - KVXVariant: COleVariant equality, copies that own their text, conversions (empty -> 0,
 //    rounding, overflow, text through the grammar, by-reference values), failures leave the
 //    out value alone;
@@ -29,7 +29,7 @@ std::wstring Text(const CString& s)
 /////////////////////////////////////////////////////////////////////////////
 // KVXString
 
-TEST(KVXStringGetAs, RoadOfOneEvent)
+TEST(KVXStringGetAs, PassesTheWholeTextToTheGrammar)
 {
     KVXString text(L"0b102");
     long value = 99;
@@ -38,74 +38,19 @@ TEST(KVXStringGetAs, RoadOfOneEvent)
     EXPECT_EQ(4, errorPos);
     EXPECT_EQ(2, text.GetBase());
     EXPECT_EQ(99, value);
-
-    text = L"0b10";  // the "2" deleted
+    text = L"-0x1F";
     EXPECT_EQ(KVT_CONVERT_OK, text.GetAs(value, errorPos));
-    EXPECT_EQ(2, value);
+    EXPECT_EQ(-31, value);
     EXPECT_EQ(0, errorPos);
-}
-
-TEST(KVXStringGetAs, LongRangeEnds)
-{
-    long value = 0;
-    int errorPos = -1;
-    EXPECT_EQ(KVT_CONVERT_OVERFLOW, KVXString(L"2147483648").GetAs(value, errorPos));
-    EXPECT_EQ(KVT_CONVERT_UNDERFLOW, KVXString(L"-2147483649").GetAs(value, errorPos));
-    EXPECT_EQ(KVT_CONVERT_OK, KVXString(L"0x1F").GetAs(value, errorPos));
-    EXPECT_EQ(31, value);
-    EXPECT_EQ(KVT_CONVERT_OK, KVXString(L"0b101").GetAs(value, errorPos));
-    EXPECT_EQ(5, value);
-    EXPECT_EQ(KVT_CONVERT_NOT_A_NUMBER, KVXString(L"-").GetAs(value, errorPos));
-}
-
-TEST(KVXStringGetAs, DoubleTexts)
-{
-    double value = 0.0;
-    int errorPos = -1;
-    EXPECT_EQ(KVT_CONVERT_OK, KVXString(L"1e301").GetAs(value, errorPos));
-    EXPECT_EQ(1e301, value);
-    EXPECT_EQ(KVT_CONVERT_OVERFLOW, KVXString(L"1e309").GetAs(value, errorPos));
-    EXPECT_EQ(KVT_CONVERT_UNDERFLOW, KVXString(L"-1e309").GetAs(value, errorPos));
-    EXPECT_EQ(KVT_CONVERT_SYNTAX_ERROR, KVXString(L"12,5").GetAs(value, errorPos));
+    double d = 0.0;
+    EXPECT_EQ(KVT_CONVERT_UNDERFLOW, KVXString(L"-1e309").GetAs(d, errorPos));
+    EXPECT_EQ(KVT_CONVERT_OK, KVXString(L"1e301").GetAs(d, errorPos));
+    EXPECT_EQ(1e301, d);
+    // The length is the object's: an embedded NUL is an offending character.
+    KVXString withNul(L"12\0" L"3", 4);
+    EXPECT_EQ(KVT_CONVERT_SYNTAX_ERROR, withNul.GetAs(value, errorPos));
     EXPECT_EQ(2, errorPos);
-    EXPECT_EQ(KVT_CONVERT_SYNTAX_ERROR, KVXString(L"e").GetAs(value, errorPos));
-    EXPECT_EQ(0, errorPos);
-    EXPECT_EQ(KVT_CONVERT_NOT_A_NUMBER, KVXString(L".").GetAs(value, errorPos));
-}
-
-TEST(KVXStringGetAs, EmbeddedNulIsAnOffendingCharacter)
-{
-    KVXString text(L"12\0" L"3", 4);
-    ASSERT_EQ(4, text.GetLength());
-    long value = 0;
-    int errorPos = -1;
-    EXPECT_EQ(KVT_CONVERT_SYNTAX_ERROR, text.GetAs(value, errorPos));
-    EXPECT_EQ(2, errorPos);
-}
-
-TEST(KVXStringFormat, PrintfStyle)
-{
-    KVXString text;
-    text.Format(L"%ld", -2147483647L - 1);
-    EXPECT_EQ(L"-2147483648", Text(text));
-    text.Format(L"%X", 255);
-    EXPECT_EQ(L"FF", Text(text));
-    text.Format(L"%.16g", 12.5);
-    EXPECT_EQ(L"12.5", Text(text));
-    text.Format(L"%s|%d", L"ab", 7);
-    EXPECT_EQ(L"ab|7", Text(text));
-    text.Format(static_cast<LPCTSTR>(NULL));
-    EXPECT_EQ(L"", Text(text));
-}
-
-TEST(KVXStringCharacters, GrammarLetters)
-{
-    EXPECT_EQ(L'E', KVXString::GetUpperEngDeli());
-    EXPECT_EQ(L'e', KVXString::GetLowerEngDeli());
-    EXPECT_EQ(L'B', KVXString::GetUpperBinary());
-    EXPECT_EQ(L'b', KVXString::GetLowerBinary());
-    EXPECT_EQ(L'r', KVXString::GetRealFlagFloat());
-    EXPECT_EQ(L'R', KVXString::GetRealFlagDouble());
+    EXPECT_EQ(KVT_CONVERT_SYNTAX_ERROR, withNul.GetAs(d, errorPos));
 }
 
 class FormatTypeProbe : public KVXString
@@ -114,12 +59,23 @@ public:
     BOOL Probe(WCHAR ch) const { return IsFmtType(ch); }
 };
 
-TEST(KVXStringCharacters, IsFmtType)
+TEST(KVXStringFormat, PrintfStyleAndTheGrammarCharacters)
 {
+    KVXString text;
+    text.Format(L"%ld|%X|%s", -2147483647L - 1, 255, L"ab");
+    EXPECT_EQ(L"-2147483648|FF|ab", Text(text));
+    text.Format(static_cast<LPCTSTR>(NULL));
+    EXPECT_EQ(L"", Text(text));
+
+    EXPECT_EQ(L'E', KVXString::GetUpperEngDeli());
+    EXPECT_EQ(L'e', KVXString::GetLowerEngDeli());
+    EXPECT_EQ(L'B', KVXString::GetUpperBinary());
+    EXPECT_EQ(L'b', KVXString::GetLowerBinary());
+    EXPECT_EQ(L'r', KVXString::GetRealFlagFloat());
+    EXPECT_EQ(L'R', KVXString::GetRealFlagDouble());
     FormatTypeProbe probe;
-    const std::wstring listed = L"%BCEGTXbcdefgiopstux";
-    for (WCHAR ch = 1; ch < 128; ++ch)
-        EXPECT_EQ(listed.find(ch) != std::wstring::npos ? TRUE : FALSE, probe.Probe(ch)) << "character " << char(ch);
+    EXPECT_EQ(TRUE, probe.Probe(L'T'));
+    EXPECT_EQ(FALSE, probe.Probe(L'a'));
 }
 
 TEST(KVXStringBasics, BehavesAsCString)
@@ -150,12 +106,9 @@ TEST(KVXVariantEquality, AsCOleVariant)
     EXPECT_NE(KVXVariant(5L), KVXVariant(6L));
     EXPECT_NE(KVXVariant(1L), KVXVariant(1.0)) << "type counts";
     EXPECT_NE(KVXVariant(), KVXVariant(0L)) << "empty is not zero";
-    EXPECT_EQ(KVXVariant(2.5), KVXVariant(2.5));
     EXPECT_NE(KVXVariant(NAN), KVXVariant(NAN));
     EXPECT_EQ(KVXVariant(KVXString(L"abc")), KVXVariant(KVXString(L"abc")));
-    EXPECT_NE(KVXVariant(KVXString(L"abc")), KVXVariant(KVXString(L"abd")));
     EXPECT_NE(KVXVariant(KVXString(L"ab")), KVXVariant(KVXString(L"abc")));
-    EXPECT_EQ(KVXVariant(KVXString(L"")), KVXVariant(KVXString(L"")));
     EXPECT_FALSE(KVXVariant(3L) != KVXVariant(3L));
 }
 
@@ -234,10 +187,6 @@ struct ToLongCase
     long expected;
 };
 
-void PrintTo(const ToLongCase& c, std::ostream* os) { *os << c.name; }
-
-std::string ToLongName(const testing::TestParamInfo<ToLongCase>& info) { return info.param.name; }
-
 VARIANT MakeVariant(VARTYPE vt, LONGLONG bits)
 {
     VARIANT var;
@@ -261,15 +210,11 @@ const ToLongCase kToLongCases[] = {
     { "WholeDouble", KVXVariant(7.0), KVT_VARIANT_OK, 7 },
     { "HalfRoundsToEvenDown", KVXVariant(2.5), KVT_VARIANT_OK, 2 },
     { "HalfRoundsToEvenUp", KVXVariant(3.5), KVT_VARIANT_OK, 4 },
-    { "NegativeHalf", KVXVariant(-2.5), KVT_VARIANT_OK, -2 },
     { "DoubleAtMin", KVXVariant(-2147483648.0), KVT_VARIANT_OK, LONG_MIN },
     { "DoubleAboveMax", KVXVariant(2147483648.0), KVT_VARIANT_OVERFLOW, 0 },
-    { "DoubleHuge", KVXVariant(1e300), KVT_VARIANT_OVERFLOW, 0 },
     { "DoubleNan", KVXVariant(NAN), KVT_VARIANT_NOT_A_NUMBER, 0 },
     { "TextHex", KVXVariant(KVXString(L"0x1F")), KVT_VARIANT_OK, 31 },
-    { "TextBlanks", KVXVariant(KVXString(L" -12 ")), KVT_VARIANT_OK, -12 },
     { "TextFraction", KVXVariant(KVXString(L"12.5")), KVT_VARIANT_NOT_A_NUMBER, 0 },
-    { "TextWord", KVXVariant(KVXString(L"abc")), KVT_VARIANT_NOT_A_NUMBER, 0 },
     { "TextOverflow", KVXVariant(KVXString(L"2147483648")), KVT_VARIANT_OVERFLOW, 0 },
     { "TextEmpty", KVXVariant(KVXString(L"")), KVT_VARIANT_NOT_A_NUMBER, 0 },
     { "Short", KVXVariant(MakeVariant(VT_I2, 300)), KVT_VARIANT_OK, 300 },
@@ -283,67 +228,62 @@ const ToLongCase kToLongCases[] = {
     { "Unsigned64Huge", KVXVariant(MakeVariant(VT_UI8, -1)), KVT_VARIANT_OVERFLOW, 0 },
 };
 
-class VariantToLong : public testing::TestWithParam<ToLongCase> {};
-
-TEST_P(VariantToLong, Converts)
+TEST(KVXVariantConversion, ToLong)
 {
-    const ToLongCase& c = GetParam();
-    long value = 12345;
-    EXPECT_EQ(c.result, c.value.GetAs(value, 1));
-    EXPECT_EQ(c.result == KVT_VARIANT_OK ? c.expected : 12345, value);
+    for (const ToLongCase& c : kToLongCases)
+    {
+        long value = 12345;
+        EXPECT_EQ(c.result, c.value.GetAs(value, 1)) << c.name;
+        EXPECT_EQ(c.result == KVT_VARIANT_OK ? c.expected : 12345, value) << c.name;
+    }
 }
 
-INSTANTIATE_TEST_SUITE_P(Table, VariantToLong, testing::ValuesIn(kToLongCases), ToLongName);
-
-TEST(KVXVariantConversion, ToDouble)
+VARIANT MakeSingle(float value)
 {
-    double value = 0.0;
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(-3L).GetAs(value));
-    EXPECT_EQ(-3.0, value);
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(0.1).GetAs(value));
-    EXPECT_EQ(0.1, value);
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(KVXString(L"1.5e3")).GetAs(value));
-    EXPECT_EQ(1500.0, value);
-    value = 7.0;
-    EXPECT_EQ(KVT_VARIANT_OVERFLOW, KVXVariant(KVXString(L"1e309")).GetAs(value));
-    EXPECT_EQ(KVT_VARIANT_OVERFLOW, KVXVariant(KVXString(L"1e-400")).GetAs(value));
-    EXPECT_EQ(KVT_VARIANT_NOT_A_NUMBER, KVXVariant(KVXString(L"1,5")).GetAs(value));
-    EXPECT_EQ(KVT_VARIANT_TYPE_MISMATCH, KVXVariant(MakeVariant(VT_NULL, 0)).GetAs(value));
-    EXPECT_EQ(7.0, value);
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(MakeVariant(VT_I2, 300)).GetAs(value));
-    EXPECT_EQ(300.0, value);
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(MakeVariant(VT_UI4, 0xFFFFFFFF)).GetAs(value));
-    EXPECT_EQ(4294967295.0, value);
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(MakeVariant(VT_UI8, -1)).GetAs(value));
-    EXPECT_EQ(18446744073709551616.0, value);
+    VARIANT var;
+    VariantInit(&var);
+    var.vt = VT_R4;
+    var.fltVal = value;
+    return var;
 }
 
-TEST(KVXVariantConversion, ToText)
+TEST(KVXVariantConversion, ToDoubleAndToText)
 {
-    KVXString text;
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(-42L).GetAs(text));
-    EXPECT_EQ(L"-42", Text(text));
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(0.1).GetAs(text));
-    EXPECT_EQ(L"0.1", Text(text));
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(1e300).GetAs(text));
-    EXPECT_EQ(L"1e+300", Text(text));
-    VARIANT single;
-    VariantInit(&single);
-    single.vt = VT_R4;
-    single.fltVal = 0.1f;
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(single).GetAs(text));
-    EXPECT_EQ(L"0.1", Text(text));
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(MakeVariant(VT_I2, -7)).GetAs(text));
-    EXPECT_EQ(L"-7", Text(text));
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(MakeVariant(VT_UI4, 0xFFFFFFFF)).GetAs(text));
-    EXPECT_EQ(L"4294967295", Text(text));
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(MakeVariant(VT_I8, INT64_MIN)).GetAs(text));
-    EXPECT_EQ(L"-9223372036854775808", Text(text));
-    EXPECT_EQ(KVT_VARIANT_OK, KVXVariant(MakeVariant(VT_UI8, -1)).GetAs(text));
-    EXPECT_EQ(L"18446744073709551615", Text(text));
-    text = L"kept";
-    EXPECT_EQ(KVT_VARIANT_TYPE_MISMATCH, KVXVariant(MakeVariant(VT_NULL, 0)).GetAs(text));
-    EXPECT_EQ(L"kept", Text(text));
+    const struct { const char* name; KVXVariant value; KVTEnumVariantError result; double expected; } doubles[] = {
+        { "Long", KVXVariant(-3L), KVT_VARIANT_OK, -3.0 },
+        { "TextExponent", KVXVariant(KVXString(L"1.5e3")), KVT_VARIANT_OK, 1500.0 },
+        { "TextOverflow", KVXVariant(KVXString(L"1e309")), KVT_VARIANT_OVERFLOW, 0 },
+        { "TextTooSmall", KVXVariant(KVXString(L"1e-400")), KVT_VARIANT_OVERFLOW, 0 },
+        { "TextComma", KVXVariant(KVXString(L"1,5")), KVT_VARIANT_NOT_A_NUMBER, 0 },
+        { "Null", KVXVariant(MakeVariant(VT_NULL, 0)), KVT_VARIANT_TYPE_MISMATCH, 0 },
+        { "UnsignedAllBits", KVXVariant(MakeVariant(VT_UI4, 0xFFFFFFFF)), KVT_VARIANT_OK, 4294967295.0 },
+        { "Unsigned64AllBits", KVXVariant(MakeVariant(VT_UI8, -1)), KVT_VARIANT_OK, 18446744073709551616.0 },
+    };
+    for (const auto& c : doubles)
+    {
+        double value = 7.0;
+        EXPECT_EQ(c.result, c.value.GetAs(value)) << c.name;
+        EXPECT_EQ(c.result == KVT_VARIANT_OK ? c.expected : 7.0, value) << c.name;
+    }
+    const struct { KVXVariant value; const wchar_t* text; } texts[] = {
+        { KVXVariant(-42L), L"-42" },
+        { KVXVariant(0.1), L"0.1" },
+        { KVXVariant(1e300), L"1e+300" },
+        { KVXVariant(MakeSingle(0.1f)), L"0.1" },
+        { KVXVariant(MakeVariant(VT_I2, -7)), L"-7" },
+        { KVXVariant(MakeVariant(VT_UI4, 0xFFFFFFFF)), L"4294967295" },
+        { KVXVariant(MakeVariant(VT_I8, INT64_MIN)), L"-9223372036854775808" },
+        { KVXVariant(MakeVariant(VT_UI8, -1)), L"18446744073709551615" },
+    };
+    for (const auto& c : texts)
+    {
+        KVXString text;
+        EXPECT_EQ(KVT_VARIANT_OK, c.value.GetAs(text)) << Text(KVXString(c.text));
+        EXPECT_EQ(std::wstring(c.text), Text(text));
+    }
+    KVXString kept(L"kept");
+    EXPECT_EQ(KVT_VARIANT_TYPE_MISMATCH, KVXVariant(MakeVariant(VT_NULL, 0)).GetAs(kept));
+    EXPECT_EQ(L"kept", Text(kept));
 }
 
 TEST(KVXVariantConversion, ByReferenceValues)
@@ -385,57 +325,39 @@ struct MembershipCase
     bool inside;
 };
 
-void PrintTo(const MembershipCase& c, std::ostream* os) { *os << c.name; }
-
-std::string MembershipName(const testing::TestParamInfo<MembershipCase>& info) { return info.param.name; }
-
 const double kNextAboveOne = std::nextafter(1.0, 2.0);
 const double kNextBelowTen = std::nextafter(10.0, 0.0);
 
 const MembershipCase kMembershipCases[] = {
     { "LongMinIncluded", 1L, 10L, true, true, 1L, true },
     { "LongMaxIncluded", 1L, 10L, true, true, 10L, true },
-    { "LongBelow", 1L, 10L, true, true, 0L, false },
     { "LongAbove", 1L, 10L, true, true, 11L, false },
     { "LongMinExcluded", 1L, 10L, false, true, 1L, false },
-    { "LongNextToMinExcluded", 1L, 10L, false, true, 2L, true },
     { "LongMaxExcluded", 1L, 10L, true, false, 10L, false },
-    { "LongNextToMaxExcluded", 1L, 10L, true, false, 9L, true },
-    { "LongFullRangeMin", LONG_MIN, LONG_MAX, true, true, LONG_MIN, true },
     { "LongFullRangeMax", LONG_MIN, LONG_MAX, true, true, LONG_MAX, true },
     { "LongRangeDoubleInside", 1L, 10L, false, false, 1.5, true },
     { "LongRangeDoubleJustAbove", 1L, 10L, true, true, 10.000001, false },
     { "LongRangeEmptyValueIsZero", -1L, 1L, true, true, KVXVariant(), true },
     { "LongRangeText", 1L, 10L, true, true, KVXString(L"5"), true },
     { "LongRangeNotANumber", 1L, 10L, true, true, KVXString(L"x"), false },
-    { "DoubleMinIncluded", 1.0, 10.0, true, true, 1.0, true },
-    { "DoubleMaxIncluded", 1.0, 10.0, true, true, 10.0, true },
     { "DoubleMinExcluded", 1.0, 10.0, false, true, 1.0, false },
     { "DoubleNextAboveExcludedMin", 1.0, 10.0, false, true, kNextAboveOne, true },
     { "DoubleMaxExcluded", 1.0, 10.0, true, false, 10.0, false },
     { "DoubleNextBelowExcludedMax", 1.0, 10.0, true, false, kNextBelowTen, true },
-    { "DoubleBelow", 1.0, 10.0, true, true, 0.999, false },
     { "DoubleLongValue", 1.0, 10.0, true, true, 10L, true },
     { "DoubleNan", 1.0, 10.0, true, true, NAN, false },
     { "DoubleEditDefault", -1e300, 1e300, true, true, 1e301, false },
-    { "DoubleEditDefaultInside", -1e300, 1e300, true, true, -1e300, true },
     { "ReversedEnds", 10L, 1L, true, true, 5L, true },
-    { "ReversedEndsOutside", 10L, 1L, true, true, 11L, false },
     { "NanEndContainsNothing", NAN, 10.0, true, true, 5.0, false },
     { "TextEndThatIsNoNumber", KVXString(L"abc"), 10L, true, true, 5L, false },
     { "PointRangeExcluded", 5L, 5L, false, true, 5L, false },
 };
 
-class RangeMembership : public testing::TestWithParam<MembershipCase> {};
-
-TEST_P(RangeMembership, IsInRange)
+TEST(KVXRangeTable, IsInRange)
 {
-    const MembershipCase& c = GetParam();
-    KVXRange range = MakeRange(c.minimum, c.maximum, c.minInclude, c.maxInclude);
-    EXPECT_EQ(c.inside, range.IsInRange(c.value));
+    for (const MembershipCase& c : kMembershipCases)
+        EXPECT_EQ(c.inside, MakeRange(c.minimum, c.maximum, c.minInclude, c.maxInclude).IsInRange(c.value)) << c.name;
 }
-
-INSTANTIATE_TEST_SUITE_P(Table, RangeMembership, testing::ValuesIn(kMembershipCases), MembershipName);
 
 struct InRangeCase
 {
@@ -446,12 +368,7 @@ struct InRangeCase
     bool anyInside;  // false: no value lies in the range, the ends come back as set
 };
 
-void PrintTo(const InRangeCase& c, std::ostream* os) { *os << c.name; }
-
-std::string InRangeName(const testing::TestParamInfo<InRangeCase>& info) { return info.param.name; }
-
 const InRangeCase kInRangeCases[] = {
-    { "LongIncluded", 1L, 10L, true, true, 1L, 10L, true },
     { "LongExcluded", 1L, 10L, false, false, 2L, 9L, true },
     { "LongFullRangeExcluded", LONG_MIN, LONG_MAX, false, false, LONG_MIN + 1, LONG_MAX - 1, true },
     { "LongReversed", 10L, 1L, true, false, 1L, 9L, true },
@@ -467,31 +384,29 @@ const InRangeCase kInRangeCases[] = {
     { "NanEnd", NAN, 1.0, true, true, NAN, 1.0, false },
 };
 
-class RangeEnds : public testing::TestWithParam<InRangeCase> {};
-
-TEST_P(RangeEnds, InRangeValues)
+TEST(KVXRangeTable, InRangeValues)
 {
-    const InRangeCase& c = GetParam();
-    KVXRange range = MakeRange(c.minimum, c.maximum, c.minInclude, c.maxInclude);
-    KVXVariant lowest = range.GetMinimumInRange();
-    KVXVariant highest = range.GetMaximumInRange();
-    double lowestValue = 0.0, highestValue = 0.0, expectedLow = 0.0, expectedHigh = 0.0;
-    lowest.GetAs(lowestValue);
-    highest.GetAs(highestValue);
-    c.lowest.GetAs(expectedLow);
-    c.highest.GetAs(expectedHigh);
-    if (std::isnan(expectedLow))
-        EXPECT_TRUE(std::isnan(lowestValue)) << lowestValue;
-    else
-        EXPECT_EQ(expectedLow, lowestValue);
-    EXPECT_EQ(expectedHigh, highestValue);
-    EXPECT_EQ(c.lowest.GetType(), lowest.GetType());
-    EXPECT_EQ(c.highest.GetType(), highest.GetType());
-    EXPECT_EQ(c.anyInside, range.IsInRange(lowest));
-    EXPECT_EQ(c.anyInside, range.IsInRange(highest));
+    for (const InRangeCase& c : kInRangeCases)
+    {
+        SCOPED_TRACE(c.name);
+        const KVXRange range = MakeRange(c.minimum, c.maximum, c.minInclude, c.maxInclude);
+        const KVXVariant lowest = range.GetMinimumInRange(), highest = range.GetMaximumInRange();
+        double low = 0.0, high = 0.0, expectedLow = 0.0, expectedHigh = 0.0;
+        lowest.GetAs(low);
+        highest.GetAs(high);
+        c.lowest.GetAs(expectedLow);
+        c.highest.GetAs(expectedHigh);
+        if (std::isnan(expectedLow))
+            EXPECT_TRUE(std::isnan(low)) << low;
+        else
+            EXPECT_EQ(expectedLow, low);
+        EXPECT_EQ(expectedHigh, high);
+        EXPECT_EQ(c.lowest.GetType(), lowest.GetType());
+        EXPECT_EQ(c.highest.GetType(), highest.GetType());
+        EXPECT_EQ(c.anyInside, range.IsInRange(lowest));
+        EXPECT_EQ(c.anyInside, range.IsInRange(highest));
+    }
 }
-
-INSTANTIATE_TEST_SUITE_P(Table, RangeEnds, testing::ValuesIn(kInRangeCases), InRangeName);
 
 TEST(KVXRangeBuilding, EmptyThenAdjust)
 {
