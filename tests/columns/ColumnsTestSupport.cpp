@@ -1,0 +1,257 @@
+// Shared by the windowed column tests.
+#include "ColumnsTestSupport.h"
+
+#include "KVXListCtrlPropSheet.h"
+#include "OrvaneLibrary.h"
+
+#include <new>
+
+namespace columns_test {
+
+namespace {
+
+struct KnownColumn { LPCWSTR title; int width; unsigned char sortType; bool shown; };
+const KnownColumn kKnown[] = {
+    { L"Alpha", 90, 1, true }, { L"Beta", 80, 2, true }, { L"Gamma", 70, 3, true }, { L"Delta", 100, 0, true },
+    { L"Zeta", 110, 4, false }, { L"Epsilon", 60, 5, false },
+};
+const int kRows = 3;
+const int kFirstItemData = 10;
+
+DragDriver* g_pDriver = nullptr;
+// A drag still running then is dropped where the cursor is.
+const int kLastTick = 60;
+
+} // namespace
+
+std::string Narrow(const CString& text)
+{
+    std::string s;
+    for (int i = 0; i < text.GetLength(); ++i)
+        s += static_cast<char>(text[i]);
+    return s;
+}
+
+std::string CTestList::Types() const
+{
+    std::string types;
+    for (unsigned int i = 0; i < m_nColumnTypes; ++i)
+        types += (i > 0 ? "," : "") + std::to_string(m_pColumnTypes[i]);
+    return types;
+}
+
+KVXColumnsPropPage* CTestList::Page() const
+{
+    return m_pPropFrame != NULL && m_pPropFrame->m_pSheet != NULL ? &m_pPropFrame->m_pSheet->m_page : NULL;
+}
+
+void CFiller::Fill(LVITEMW& item, KVXColumnInfo* pColumnInfo)
+{
+    if (item.iItem == 0)
+        m_trace += Narrow(pColumnInfo->GetTitle()) + ",";
+    CString text;
+    text.Format(L"%s%d", static_cast<LPCWSTR>(pColumnInfo->GetTitle()), static_cast<int>(item.lParam));
+    item.mask |= LVIF_TEXT;
+    item.pszText = KVXDragColumnListCtrl::AllocItemText(text);
+}
+
+const INT kEdgeElements[2] = { COLOR_3DHILIGHT, COLOR_3DDKSHADOW };
+
+EdgeColorsGuard::EdgeColorsGuard()
+    : m_saved{ ::GetSysColor(COLOR_3DHILIGHT), ::GetSysColor(COLOR_3DDKSHADOW) }
+{
+    const COLORREF colors[2] = { RGB(0, 160, 0), RGB(128, 0, 0) };
+    ::SetSysColors(2, kEdgeElements, colors);
+}
+
+EdgeColorsGuard::~EdgeColorsGuard()
+{
+    ::SetSysColors(2, kEdgeElements, m_saved);
+}
+
+DragDriver::DragDriver(POINT screenTarget, int releaseTick, std::function<void(int)> onTick)
+    : m_target(screenTarget), m_nRelease(releaseTick), m_onTick(std::move(onTick))
+{
+    g_pDriver = this;
+    m_nTimer = ::SetTimer(NULL, 0, 30, &DragDriver::Tick);
+}
+
+DragDriver::~DragDriver()
+{
+    ::KillTimer(NULL, m_nTimer);
+    g_pDriver = nullptr;
+}
+
+void CALLBACK DragDriver::Tick(HWND, UINT, UINT_PTR, DWORD)
+{
+    DragDriver* p = g_pDriver;
+    if (p == nullptr)
+        return;
+    ++p->m_nTicks;
+    if (p->m_nTicks == 1)
+        ::SetCursorPos(p->m_target.x, p->m_target.y);
+    BYTE state[256];
+    ::GetKeyboardState(state);
+    if (p->m_nTicks == p->m_nRelease || p->m_nTicks > kLastTick)
+        state[VK_LBUTTON] = 0;
+    ::SetKeyboardState(state);
+    if (p->m_onTick)
+        p->m_onTick(p->m_nTicks);
+}
+
+void ColumnsFixture::SetUp()
+{
+    orvane_test::LoadLibraryOnce();
+    ASSERT_TRUE(AfxOleInit());
+    m_host.reset(new orvane_test::HostWindow(540, 320));
+    CreateList();
+}
+
+void ColumnsFixture::CreateList(void* pStorage)
+{
+    m_pList = pStorage != nullptr ? new (pStorage) CTestList : new CTestList;
+    ASSERT_TRUE(m_pList->Create(WS_CHILD | WS_VISIBLE | LVS_REPORT, CRect(10, 10, 530, 290),
+        CWnd::FromHandle(*m_host), 5));
+    m_pList->SetCallbackWindow(&m_filler);
+    m_pList->SetFillItem(static_cast<void (CWnd::*)(LVITEMW&, KVXColumnInfo*)>(&CFiller::Fill));
+    for (const KnownColumn& c : kKnown)
+    {
+        KVXColumnInfo* pColumnInfo = new KVXColumnInfo(-1, c.title, -1, c.width, LVCFMT_LEFT);
+        pColumnInfo->SetSortType(c.sortType);
+        m_pList->AddColumn(pColumnInfo);
+    }
+    int nColumn = 0;
+    for (const KnownColumn& c : kKnown)
+    {
+        if (c.shown)
+            ASSERT_EQ(nColumn, m_pList->InsertColumn(c.title, nColumn)) << nColumn;
+        nColumn += c.shown ? 1 : 0;
+    }
+    m_pList->SetRedraw(FALSE);
+    for (int i = 0; i < kRows; ++i)
+        m_pList->InsertItem(LVIF_TEXT | LVIF_PARAM, i, L"", 0, 0, 0, kFirstItemData + i);
+    m_pList->SetRedraw(TRUE);
+    m_pList->UpdateWindow();
+    m_filler.m_trace.clear();
+}
+
+void ColumnsFixture::TearDown()
+{
+    if (m_pList != nullptr)
+    {
+        m_pList->DestroyWindow();
+        delete m_pList;
+    }
+    m_host.reset();
+    orvane_test::PumpUntilIdle(50);
+}
+
+std::string ColumnsFixture::Layout()
+{
+    CHeaderCtrl& header = m_pList->m_HeaderCtrl;
+    std::string layout;
+    for (int i = 0; i < header.GetItemCount(); ++i)
+    {
+        WCHAR title[64] = {};
+        HDITEM item = {};
+        item.mask = HDI_TEXT;
+        item.pszText = title;
+        item.cchTextMax = 64;
+        header.GetItem(i, &item);
+        int nRecords = 0;
+        for (POSITION pos = m_pList->GetColumnInfos().GetHeadPosition(); pos != NULL;)
+        {
+            const KVXColumnInfo* pColumnInfo = m_pList->GetColumnInfos().GetNext(pos);
+            nRecords += pColumnInfo->GetIndex() == i && pColumnInfo->GetTitle() == title ? 1 : 0;
+        }
+        bool bCells = true;
+        for (int row = 0; row < m_pList->GetItemCount(); ++row)
+        {
+            CString expected;
+            expected.Format(L"%s%d", title, static_cast<int>(m_pList->GetItemData(row)));
+            bCells = bCells && m_pList->GetItemText(row, i) == expected;
+        }
+        layout += (i > 0 ? "|" : "") + Narrow(title) + (bCells ? "" : "*") + (nRecords == 1 ? "" : "?");
+    }
+    // a record whose index lies beyond the columns
+    for (POSITION pos = m_pList->GetColumnInfos().GetHeadPosition(); pos != NULL;)
+    {
+        if (m_pList->GetColumnInfos().GetNext(pos)->GetIndex() >= header.GetItemCount())
+            layout += "|?";
+    }
+    return layout;
+}
+
+std::string ColumnsFixture::Strips()
+{
+    KVXColumnsPropPage* pPage = m_pList->Page();
+    if (pPage == NULL)
+        return "no chooser";
+    std::string strips;
+    for (int i = 0; i < pPage->m_listColumns.GetItemCount(); ++i)
+    {
+        const KVXColumnInfo* pColumnInfo = reinterpret_cast<const KVXColumnInfo*>(pPage->m_listColumns.GetItemData(i));
+        strips += (i > 0 ? "|" : "") + Narrow(pPage->m_listColumns.GetItemText(i, 0)) + ":"
+            + std::to_string(pColumnInfo->GetWidth());
+    }
+    return strips;
+}
+
+POINT ColumnsFixture::ScreenPoint(HWND hwnd, int x, int y)
+{
+    POINT pt = { x, y };
+    ::ClientToScreen(hwnd, &pt);
+    return pt;
+}
+
+POINT ColumnsFixture::HeaderPoint(int item, int x)
+{
+    CRect rect;
+    m_pList->m_HeaderCtrl.GetItemRect(item, &rect);
+    return ScreenPoint(m_pList->m_HeaderCtrl, x < 0 ? rect.CenterPoint().x : rect.left + x, rect.CenterPoint().y);
+}
+
+void ColumnsFixture::OpenChooser()
+{
+    m_pList->Customize();
+    ASSERT_NE(nullptr, m_pList->Page());
+    CRect rect;
+    m_pList->m_pPropFrame->GetWindowRect(&rect);
+    m_pList->m_pPropFrame->SetWindowPos(NULL, 560, 0, 0, 0, SWP_NOSIZE | SWP_NOZORDER | SWP_NOACTIVATE);
+    m_pList->m_pPropFrame->UpdateWindow();
+    orvane_test::PumpUntilIdle(50);
+}
+
+void ColumnsFixture::DragHeaderItem(int item, POINT target, int releaseTick, std::function<void(int)> onTick)
+{
+    const POINT start = HeaderPoint(item);
+    ::SetCursorPos(start.x, start.y);
+    orvane_test::PumpUntilIdle(50);
+    const HWND hHeader = m_pList->m_HeaderCtrl.m_hWnd;
+    POINT client = start;
+    ::ScreenToClient(hHeader, &client);
+    DragDriver driver(target, releaseTick, std::move(onTick));
+    ::SendMessage(hHeader, WM_LBUTTONDOWN, MK_LBUTTON, orvane_test::PointParam(client.x, client.y));
+    ::SendMessage(hHeader, WM_MOUSEMOVE, MK_LBUTTON, orvane_test::PointParam(client.x + 1, client.y));
+}
+
+void ColumnsFixture::DragStrip(int row, POINT target, int releaseTick, std::function<void(int)> onTick)
+{
+    CListCtrl& strips = m_pList->Page()->m_listColumns;
+    CRect rect;
+    strips.GetItemRect(row, &rect, LVIR_BOUNDS);
+    const HWND hStrips = strips.m_hWnd;
+    const POINT start = ScreenPoint(hStrips, rect.left + 20, rect.CenterPoint().y);
+    ::SetCursorPos(start.x, start.y);
+    orvane_test::PumpUntilIdle(50);
+    {
+        DragDriver driver(target, releaseTick, std::move(onTick));
+        const int y = rect.CenterPoint().y;
+        ::SendMessage(hStrips, WM_LBUTTONDOWN, MK_LBUTTON, orvane_test::PointParam(20, y));
+        ::SendMessage(hStrips, WM_MOUSEMOVE, MK_LBUTTON, orvane_test::PointParam(40, y));
+    }
+    if (::IsWindow(hStrips))
+        ::SendMessage(hStrips, WM_LBUTTONUP, 0, orvane_test::PointParam(40, rect.CenterPoint().y));
+}
+
+} // namespace columns_test

@@ -1,0 +1,111 @@
+// The column-customising list and its chooser, without drags:
+// - InsertColumn by title: refused without records, title or position, or when the
+//   column is shown already; two hidden records of one title both go in at the
+//   position; shown columns and the sort column move along, no cell is filled;
+// - the chooser: F1 calls the help method only when target and method are set,
+//   closing hides it and Customize shows it again with its strips, it dies with
+//   the list; a chooser whose sheet cannot be made is not deleted twice, and the
+//   next Customize makes it.
+#include "ColumnsTestSupport.h"
+
+namespace columns_test {
+namespace {
+
+class ColumnListTest : public ColumnsFixture {};
+
+TEST_F(ColumnListTest, InsertColumnShowsHiddenRecordsByTitle)
+{
+    EXPECT_EQ(-1, CTestList().InsertColumn(L"Alpha", 0));
+    EXPECT_EQ(-1, m_pList->InsertColumn(L"", 0));
+    EXPECT_EQ(-1, m_pList->InsertColumn(L"Zeta", -1));
+    EXPECT_EQ(-1, m_pList->InsertColumn(L"zeta", 0));
+    EXPECT_EQ(-1, m_pList->InsertColumn(L"Beta", 0));
+    EXPECT_EQ("Alpha|Beta|Gamma|Delta", Layout());
+
+    m_pList->SortList(1, true);
+    KVXColumnInfo* pTwin = new KVXColumnInfo(-1, L"Zeta", -1, 40, LVCFMT_LEFT);
+    m_pList->AddColumn(pTwin);
+    EXPECT_EQ(0, m_pList->InsertColumn(L"Zeta", 0));
+    EXPECT_EQ(0, pTwin->GetIndex());
+    EXPECT_EQ("Zeta*|Zeta*|Alpha*|Beta|Gamma|Delta", Layout());
+    EXPECT_EQ("0,4,1,2,3,0", m_pList->Types());
+    EXPECT_EQ(3, m_pList->m_nSortColumn);
+    EXPECT_EQ("", m_filler.m_trace);
+}
+
+class CHelpTarget : public CCmdTarget
+{
+public:
+    void Help(CString strTopic, UINT nId, HWND hWnd)
+    {
+        m_calls += "'" + Narrow(strTopic) + "' " + std::to_string(nId) + (hWnd == m_hPage ? " page;" : " other;");
+    }
+    HWND m_hPage = NULL;
+    std::string m_calls;
+};
+
+int TopLevelWindows()
+{
+    int n = 0;
+    ::EnumThreadWindows(::GetCurrentThreadId(), [](HWND, LPARAM p) { ++*reinterpret_cast<int*>(p); return TRUE; },
+        reinterpret_cast<LPARAM>(&n));
+    return n;
+}
+
+TEST_F(ColumnListTest, ChooserHelpsHidesShowsAgainAndDiesWithTheList)
+{
+    const int nWindows = TopLevelWindows();
+    CHelpTarget help;
+    auto pfnHelp = static_cast<void (CCmdTarget::*)(CString, UINT, HWND)>(&CHelpTarget::Help);
+    m_pList->GetPropPageData().m_pHelpTarget = &help;
+    m_pList->GetPropPageData().m_pfnDisplayHelp = pfnHelp;
+    OpenChooser();
+    KVXColumnsPropPage* pPage = m_pList->Page();
+    help.m_hPage = pPage->m_hWnd;
+    HELPINFO info = { sizeof info, HELPINFO_WINDOW, 0, pPage->m_hWnd, 0, { 0, 0 } };
+    pPage->SendMessage(WM_HELP, 0, reinterpret_cast<LPARAM>(&info));
+    pPage->SetDisplayHelp(&help, NULL);
+    pPage->SendMessage(WM_HELP, 0, reinterpret_cast<LPARAM>(&info));
+    pPage->SetDisplayHelp(NULL, pfnHelp);
+    pPage->SendMessage(WM_HELP, 0, reinterpret_cast<LPARAM>(&info));
+    EXPECT_EQ("'' 5105 page;", help.m_calls);
+
+    CWnd* pFrame = m_pList->m_pPropFrame;
+    const HWND hFrame = pFrame->m_hWnd;
+    pFrame->SendMessage(WM_SYSCOMMAND, SC_CLOSE);
+    EXPECT_TRUE(::IsWindow(hFrame));
+    EXPECT_FALSE(pFrame->IsWindowVisible());
+    m_pList->Customize();
+    EXPECT_EQ(pFrame, m_pList->m_pPropFrame);
+    EXPECT_TRUE(pFrame->IsWindowVisible());
+    EXPECT_EQ("Epsilon:60|Zeta:110", Strips());
+
+    m_pList->DestroyWindow();
+    EXPECT_FALSE(::IsWindow(hFrame));
+    EXPECT_EQ(nWindows, TopLevelWindows());
+}
+
+// Refuses the creation of every dialog window of this thread: the chooser's sheet.
+LRESULT CALLBACK RefuseDialogs(int code, WPARAM wParam, LPARAM lParam)
+{
+    WCHAR szClass[16] = {};
+    if (code == HCBT_CREATEWND && ::GetClassNameW(reinterpret_cast<HWND>(wParam), szClass, 16) > 0
+        && lstrcmpW(szClass, L"#32770") == 0)
+        return 1;
+    return ::CallNextHookEx(NULL, code, wParam, lParam);
+}
+
+TEST_F(ColumnListTest, ChooserThatCannotBeMadeIsDeletedOnceAndMadeNextTime)
+{
+    const int nWindows = TopLevelWindows();
+    HHOOK hHook = ::SetWindowsHookExW(WH_CBT, &RefuseDialogs, NULL, ::GetCurrentThreadId());
+    m_pList->Customize();
+    ::UnhookWindowsHookEx(hHook);
+    EXPECT_EQ(nullptr, m_pList->m_pPropFrame);
+    EXPECT_EQ(nWindows, TopLevelWindows());
+    OpenChooser();
+    EXPECT_EQ("Epsilon:60|Zeta:110", Strips());
+}
+
+} // namespace
+} // namespace columns_test
