@@ -66,8 +66,14 @@ BOOL KVXColumnsPropPage::OnInitDialog()
 
 bool KVXColumnsPropPage::InsertStrip(KVXColumnInfo* pColumnInfo)
 {
-    // The list view sorts its items by title.
-    return m_listColumns.InsertItem(LVIF_TEXT | LVIF_PARAM, 0, pColumnInfo->GetTitle(), 0, 0, 0,
+    // The list view sorts its items by title (LVS_SORTASCENDING, comparing as lstrcmp
+    // does), but not every one does so while it is owner-drawn: the strip goes where
+    // the sort puts it.
+    const CString strTitle = pColumnInfo->GetTitle();
+    int nItem = 0;
+    while (nItem < m_listColumns.GetItemCount() && lstrcmp(m_listColumns.GetItemText(nItem, 0), strTitle) <= 0)
+        ++nItem;
+    return m_listColumns.InsertItem(LVIF_TEXT | LVIF_PARAM, nItem, strTitle, 0, 0, 0,
         reinterpret_cast<LPARAM>(pColumnInfo)) != -1;
 }
 

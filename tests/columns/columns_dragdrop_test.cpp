@@ -56,16 +56,16 @@ TEST_F(ColumnDragTest, HeaderToChooserAndBack)
     OpenChooser();
     EXPECT_EQ("Epsilon:60|Zeta:110", Strips());
     CListCtrl& strips = m_pList->Page()->m_listColumns;
-    DragHeaderItem(1, ScreenPoint(strips, 30, 60));
-    EXPECT_EQ("Alpha|Gamma|Delta", Layout());
+    DragHeaderItem(2, ScreenPoint(strips, 30, 60));
+    EXPECT_EQ("Alpha|Beta|Delta", Layout());
     EXPECT_EQ("", m_filler.m_trace);
-    EXPECT_EQ("Beta:80|Epsilon:60|Zeta:110", Strips());
+    EXPECT_EQ("Epsilon:60|Gamma:70|Zeta:110", Strips());
 
     // the strip's frame, from its first pixel off the window colour to its dark right edge
     EdgeColorsGuard colors;
     strips.RedrawWindow();
     CRect row;
-    strips.GetItemRect(0, &row, LVIR_BOUNDS);
+    strips.GetItemRect(1, &row, LVIR_BOUNDS);
     orvane_test::ClientCapture pixels(strips);
     int nFirst = -1, nLast = -1;
     for (int x = 0; x < pixels.width(); ++x)
@@ -75,17 +75,17 @@ TEST_F(ColumnDragTest, HeaderToChooserAndBack)
         nLast = c == ::GetSysColor(COLOR_3DDKSHADOW) ? x : nLast;
     }
     EXPECT_EQ(::GetSysColor(COLOR_3DHILIGHT), pixels.At(nFirst, row.CenterPoint().y));
-    EXPECT_EQ(80, nLast - nFirst + 1) << nFirst << ".." << nLast;
+    EXPECT_EQ(70, nLast - nFirst + 1) << nFirst << ".." << nLast;
 
     // Epsilon left of the middle of Alpha: position 0, filled like the others
-    DragStrip(1, HeaderPoint(0, 10));
-    EXPECT_EQ("Epsilon|Alpha|Gamma|Delta", Layout());
+    DragStrip(0, HeaderPoint(0, 10));
+    EXPECT_EQ("Epsilon|Alpha|Beta|Delta", Layout());
     EXPECT_EQ("Alpha,Epsilon,", m_filler.m_trace);
-    EXPECT_EQ("Beta:80|Zeta:110", Strips());
+    EXPECT_EQ("Gamma:70|Zeta:110", Strips());
     // dropped back on the chooser: nothing changes
     DragStrip(0, ScreenPoint(strips, 30, 100));
-    EXPECT_EQ("Beta:80|Zeta:110", Strips());
-    EXPECT_EQ("Epsilon|Alpha|Gamma|Delta", Layout());
+    EXPECT_EQ("Gamma:70|Zeta:110", Strips());
+    EXPECT_EQ("Epsilon|Alpha|Beta|Delta", Layout());
 }
 
 // Takes any dragged column with a copy and keeps the payload's bytes.
