@@ -288,7 +288,9 @@ void CColumnsPage::BuildList(const std::vector<KVXColumnInfo*>& records)
     for (int nRow = 0; nRow < kRows; ++nRow)
         m_pList->InsertItem(LVIF_TEXT | LVIF_PARAM, nRow, _T(""), 0, 0, 0, nRow);
     m_pList->SetRedraw(TRUE);
-    m_pList->Invalidate();
+    // A click on a header sorts by its column; the header's arrow shows the sort.
+    m_pList->EnableSort(true);
+    m_pList->SortList(1, true);
 }
 
 void CColumnsPage::FillCell(LVITEMW& item, KVXColumnInfo* pColumn)
