@@ -18,18 +18,64 @@ const KnownColumn kKnown[] = {
 const int kRows = 3;
 const int kFirstItemData = 10;
 
-DragDriver* g_pDriver = nullptr;
-// A drag still running then is dropped where the cursor is.
-const int kLastTick = 60;
+// Ticks inside DoDragDrop's loop: the cursor to the target, then the button up.
+struct DragDriver
+{
+    DragDriver(POINT target, int releaseTick, std::function<void(int)> onTick)
+        : m_target(target), m_nRelease(releaseTick), m_onTick(std::move(onTick))
+    {
+        s_pDriver = this;
+        m_nTimer = ::SetTimer(NULL, 0, 30, &DragDriver::Tick);
+    }
+    ~DragDriver() { ::KillTimer(NULL, m_nTimer); s_pDriver = nullptr; }
+    static void CALLBACK Tick(HWND, UINT, UINT_PTR, DWORD)
+    {
+        DragDriver* p = s_pDriver;
+        if (p == nullptr)
+            return;
+        if (++p->m_nTicks == 1)
+            ::SetCursorPos(p->m_target.x, p->m_target.y);
+        BYTE state[256];
+        ::GetKeyboardState(state);
+        if (p->m_nTicks == p->m_nRelease || p->m_nTicks > 60)
+            state[VK_LBUTTON] = 0;
+        ::SetKeyboardState(state);
+        if (p->m_onTick)
+            p->m_onTick(p->m_nTicks);
+    }
+    static DragDriver* s_pDriver;
+    orvane_test::KeyStateGuard m_button{ VK_LBUTTON };
+    POINT m_target;
+    int m_nRelease;
+    std::function<void(int)> m_onTick;
+    int m_nTicks = 0;
+    UINT_PTR m_nTimer = 0;
+};
+DragDriver* DragDriver::s_pDriver = nullptr;
+
+// Presses at a client point of the source window and moves: the drag runs until the
+// driver drops; a release follows if the source is still there.
+void PressAndMove(HWND hSource, POINT client, POINT target, int releaseTick, std::function<void(int)> onTick)
+{
+    POINT start = client;
+    ::ClientToScreen(hSource, &start);
+    ::SetCursorPos(start.x, start.y);
+    orvane_test::PumpUntilIdle(50);
+    {
+        DragDriver driver(target, releaseTick, std::move(onTick));
+        ::SendMessage(hSource, WM_LBUTTONDOWN, MK_LBUTTON, orvane_test::PointParam(client.x, client.y));
+        ::SendMessage(hSource, WM_MOUSEMOVE, MK_LBUTTON, orvane_test::PointParam(client.x + 20, client.y));
+    }
+    if (::IsWindow(hSource))
+        ::SendMessage(hSource, WM_LBUTTONUP, 0, orvane_test::PointParam(client.x + 20, client.y));
+}
 
 } // namespace
 
 std::string Narrow(const CString& text)
 {
-    std::string s;
-    for (int i = 0; i < text.GetLength(); ++i)
-        s += static_cast<char>(text[i]);
-    return s;
+    const LPCWSTR p = text;
+    return std::string(p, p + text.GetLength());
 }
 
 std::string CTestList::Types() const
@@ -55,50 +101,6 @@ void CFiller::Fill(LVITEMW& item, KVXColumnInfo* pColumnInfo)
     item.pszText = KVXDragColumnListCtrl::AllocItemText(text);
 }
 
-const INT kEdgeElements[2] = { COLOR_3DHILIGHT, COLOR_3DDKSHADOW };
-
-EdgeColorsGuard::EdgeColorsGuard()
-    : m_saved{ ::GetSysColor(COLOR_3DHILIGHT), ::GetSysColor(COLOR_3DDKSHADOW) }
-{
-    const COLORREF colors[2] = { RGB(0, 160, 0), RGB(128, 0, 0) };
-    ::SetSysColors(2, kEdgeElements, colors);
-}
-
-EdgeColorsGuard::~EdgeColorsGuard()
-{
-    ::SetSysColors(2, kEdgeElements, m_saved);
-}
-
-DragDriver::DragDriver(POINT screenTarget, int releaseTick, std::function<void(int)> onTick)
-    : m_target(screenTarget), m_nRelease(releaseTick), m_onTick(std::move(onTick))
-{
-    g_pDriver = this;
-    m_nTimer = ::SetTimer(NULL, 0, 30, &DragDriver::Tick);
-}
-
-DragDriver::~DragDriver()
-{
-    ::KillTimer(NULL, m_nTimer);
-    g_pDriver = nullptr;
-}
-
-void CALLBACK DragDriver::Tick(HWND, UINT, UINT_PTR, DWORD)
-{
-    DragDriver* p = g_pDriver;
-    if (p == nullptr)
-        return;
-    ++p->m_nTicks;
-    if (p->m_nTicks == 1)
-        ::SetCursorPos(p->m_target.x, p->m_target.y);
-    BYTE state[256];
-    ::GetKeyboardState(state);
-    if (p->m_nTicks == p->m_nRelease || p->m_nTicks > kLastTick)
-        state[VK_LBUTTON] = 0;
-    ::SetKeyboardState(state);
-    if (p->m_onTick)
-        p->m_onTick(p->m_nTicks);
-}
-
 void ColumnsFixture::SetUp()
 {
     orvane_test::LoadLibraryOnce();
@@ -114,18 +116,15 @@ void ColumnsFixture::CreateList(void* pStorage)
         CWnd::FromHandle(*m_host), 5));
     m_pList->SetCallbackWindow(&m_filler);
     m_pList->SetFillItem(static_cast<void (CWnd::*)(LVITEMW&, KVXColumnInfo*)>(&CFiller::Fill));
+    int nColumn = 0;
     for (const KnownColumn& c : kKnown)
     {
         KVXColumnInfo* pColumnInfo = new KVXColumnInfo(-1, c.title, -1, c.width, LVCFMT_LEFT);
         pColumnInfo->SetSortType(c.sortType);
         m_pList->AddColumn(pColumnInfo);
-    }
-    int nColumn = 0;
-    for (const KnownColumn& c : kKnown)
-    {
+        const int nShown = c.shown ? nColumn++ : -1;
         if (c.shown)
-            ASSERT_EQ(nColumn, m_pList->InsertColumn(c.title, nColumn)) << nColumn;
-        nColumn += c.shown ? 1 : 0;
+            ASSERT_EQ(nShown, m_pList->InsertColumn(c.title, nShown));
     }
     m_pList->SetRedraw(FALSE);
     for (int i = 0; i < kRows; ++i)
@@ -215,8 +214,6 @@ void ColumnsFixture::OpenChooser()
 {
     m_pList->Customize();
     ASSERT_NE(nullptr, m_pList->Page());
-    CRect rect;
-    m_pList->m_pPropFrame->GetWindowRect(&rect);
     m_pList->m_pPropFrame->SetWindowPos(NULL, 560, 0, 0, 0, SWP_NOSIZE | SWP_NOZORDER | SWP_NOACTIVATE);
     m_pList->m_pPropFrame->UpdateWindow();
     orvane_test::PumpUntilIdle(50);
@@ -224,15 +221,9 @@ void ColumnsFixture::OpenChooser()
 
 void ColumnsFixture::DragHeaderItem(int item, POINT target, int releaseTick, std::function<void(int)> onTick)
 {
-    const POINT start = HeaderPoint(item);
-    ::SetCursorPos(start.x, start.y);
-    orvane_test::PumpUntilIdle(50);
-    const HWND hHeader = m_pList->m_HeaderCtrl.m_hWnd;
-    POINT client = start;
-    ::ScreenToClient(hHeader, &client);
-    DragDriver driver(target, releaseTick, std::move(onTick));
-    ::SendMessage(hHeader, WM_LBUTTONDOWN, MK_LBUTTON, orvane_test::PointParam(client.x, client.y));
-    ::SendMessage(hHeader, WM_MOUSEMOVE, MK_LBUTTON, orvane_test::PointParam(client.x + 1, client.y));
+    CRect rect;
+    m_pList->m_HeaderCtrl.GetItemRect(item, &rect);
+    PressAndMove(m_pList->m_HeaderCtrl, rect.CenterPoint(), target, releaseTick, std::move(onTick));
 }
 
 void ColumnsFixture::DragStrip(int row, POINT target, int releaseTick, std::function<void(int)> onTick)
@@ -240,18 +231,7 @@ void ColumnsFixture::DragStrip(int row, POINT target, int releaseTick, std::func
     CListCtrl& strips = m_pList->Page()->m_listColumns;
     CRect rect;
     strips.GetItemRect(row, &rect, LVIR_BOUNDS);
-    const HWND hStrips = strips.m_hWnd;
-    const POINT start = ScreenPoint(hStrips, rect.left + 20, rect.CenterPoint().y);
-    ::SetCursorPos(start.x, start.y);
-    orvane_test::PumpUntilIdle(50);
-    {
-        DragDriver driver(target, releaseTick, std::move(onTick));
-        const int y = rect.CenterPoint().y;
-        ::SendMessage(hStrips, WM_LBUTTONDOWN, MK_LBUTTON, orvane_test::PointParam(20, y));
-        ::SendMessage(hStrips, WM_MOUSEMOVE, MK_LBUTTON, orvane_test::PointParam(40, y));
-    }
-    if (::IsWindow(hStrips))
-        ::SendMessage(hStrips, WM_LBUTTONUP, 0, orvane_test::PointParam(40, rect.CenterPoint().y));
+    PressAndMove(strips, CPoint(20, rect.CenterPoint().y), target, releaseTick, std::move(onTick));
 }
 
 } // namespace columns_test

