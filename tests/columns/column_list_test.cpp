@@ -1,8 +1,11 @@
 // The list and its chooser without drags: InsertColumn by title (refusals, two records
-// of one title, shown columns and the sort column moving along, no cell filled); F1
-// in the chooser, closing hides it, Customize shows it again, it dies with the list;
-// a chooser whose sheet cannot be made is deleted once and made by the next Customize.
+// of one title, shown columns and the sort column moving along, no cell filled); the
+// header's sort arrow where WM_USER+1 puts it; F1 in the chooser, closing hides it,
+// Customize shows it again, it dies with the list; a chooser whose sheet cannot be
+// made is deleted once and made by the next Customize.
 #include "ColumnsTestSupport.h"
+
+#include "Pixels.h"
 
 namespace columns_test {
 namespace {
@@ -27,6 +30,20 @@ TEST_F(ColumnListTest, InsertColumnShowsHiddenRecordsByTitle)
     EXPECT_EQ("0,4,1,2,3,0", m_pList->Types());
     EXPECT_EQ(3, m_pList->m_nSortColumn);
     EXPECT_EQ("", m_filler.m_trace);
+}
+
+// The arrow's dark edge inside the item (its frame left out) after WM_USER+1.
+TEST_F(ColumnListTest, SortArrowOnTheItemTheListNames)
+{
+    CRect rectItem;
+    m_pList->m_HeaderCtrl.GetItemRect(2, &rectItem);
+    rectItem.DeflateRect(3, 3);
+    for (int nColumn : { 2, -1 })
+    {
+        m_pList->m_HeaderCtrl.SendMessage(WM_USER + 1, static_cast<WPARAM>(nColumn), 0);
+        const int nDark = orvane_test::ClientCapture(m_pList->m_HeaderCtrl).Count(rectItem, ::GetSysColor(COLOR_3DDKSHADOW));
+        EXPECT_EQ(nColumn == 2, nDark > 0) << nColumn << ": " << nDark;
+    }
 }
 
 struct CHelpTarget : CCmdTarget
