@@ -4,6 +4,7 @@
 // one picture per variant, e.g. page04-list-type0.bmp) and quits (used where there
 // is no display).
 #include <afxwin.h>
+#include <afxole.h>
 #include <commctrl.h>
 
 #include "GalleryPage.h"
@@ -254,6 +255,9 @@ BOOL CGalleryApp::InitInstance()
     INITCOMMONCONTROLSEX icc = { sizeof icc, ICC_WIN95_CLASSES | ICC_TAB_CLASSES };
     ::InitCommonControlsEx(&icc);
     LoadOrvaneControlsLibrary();
+    // The column page drags its columns over OLE.
+    if (!AfxOleInit())
+        return FALSE;
 
     CGalleryWnd* wnd = new CGalleryWnd;
     if (!wnd->CreateGallery())

@@ -46,6 +46,7 @@ enum AfxSig
     AfxSig_wv,          // UINT ()
     AfxSig_bv,          // BOOL ()
     AfxSig_vCALC,       // void (BOOL, NCCALCSIZE_PARAMS*)
+    AfxSig_bHELPINFO,   // BOOL (HELPINFO*)       WM_HELP
 
     // command and notification routing (OnCmdMsg)
     AfxSig_vNMHDRpl,    // void (NMHDR*, LRESULT*)
@@ -235,6 +236,9 @@ enum AfxSig
 #define ON_WM_CONTEXTMENU() \
     { WM_CONTEXTMENU, 0, 0, 0, AfxSig_vWp, \
       AFX_WNDMSG(void (AFX_MSG_CALL CWnd::*)(CWnd*, CPoint), &ThisClass::OnContextMenu) },
+#define ON_WM_HELPINFO() \
+    { WM_HELP, 0, 0, 0, AfxSig_bHELPINFO, \
+      AFX_WNDMSG(BOOL (AFX_MSG_CALL CWnd::*)(HELPINFO*), &ThisClass::OnHelpInfo) },
 #define ON_WM_SYSCOLORCHANGE() \
     { WM_SYSCOLORCHANGE, 0, 0, 0, AfxSig_vv, \
       AFX_WNDMSG(void (AFX_MSG_CALL CWnd::*)(), &ThisClass::OnSysColorChange) },

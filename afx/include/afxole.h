@@ -216,7 +216,9 @@ public:
 
 protected:
     HWND m_hWnd;                    // the registered window
-    LPDATAOBJECT m_lpDataObject;    // held from DragEnter until DragLeave or Drop
+    LPDATAOBJECT m_lpDataObject;    // held from DragEnter until DragLeave, Drop or Revoke
+    // What OLE holds while the window is registered; Revoke cuts it off.
+    struct AFX_DROPTARGET_FORWARDER* m_pForwarder;
 
     BEGIN_INTERFACE_PART(DropTarget, IDropTarget)
         STDMETHOD(DragEnter)(LPDATAOBJECT lpDataObject, DWORD dwKeyState, POINTL pt,

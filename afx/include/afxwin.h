@@ -569,6 +569,7 @@ protected:
     afx_msg void OnWindowPosChanged(WINDOWPOS* lpwndpos);
     afx_msg void OnStyleChanged(int nStyleType, LPSTYLESTRUCT lpStyleStruct);
     afx_msg void OnCaptureChanged(CWnd* pWnd);
+    afx_msg BOOL OnHelpInfo(HELPINFO* lpHelpInfo);
 
 // Nonclient-Area message handler member functions
     afx_msg BOOL OnNcActivate(BOOL bActive);

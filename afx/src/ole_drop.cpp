@@ -135,12 +135,102 @@ STDMETHODIMP COleDropSource::XDropSource::GiveFeedback(DWORD dwEffect)
 /////////////////////////////////////////////////////////////////////////////
 // COleDropTarget
 
+// What OLE holds of a registered target. A drag over the window keeps its
+// reference after RevokeDragDrop, and the target (usually a member of the
+// window's object) may be deleted with the window while the drag runs: once
+// Revoke has cut the forwarder off, the drag's remaining calls reach nothing.
+struct AFX_DROPTARGET_FORWARDER : public IDropTarget
+{
+    explicit AFX_DROPTARGET_FORWARDER(COleDropTarget* pTarget) : m_nRef(1), m_pTarget(pTarget)
+    {
+        pTarget->ExternalAddRef();
+    }
+
+    void Disconnect()
+    {
+        COleDropTarget* pTarget = m_pTarget;
+        m_pTarget = NULL;
+        if (pTarget != NULL)
+            pTarget->ExternalRelease();
+    }
+
+    IDropTarget* Target() const
+    {
+        return m_pTarget != NULL ? (IDropTarget*)m_pTarget->GetInterface(&IID_IDropTarget) : NULL;
+    }
+
+    STDMETHOD(QueryInterface)(REFIID iid, LPVOID* ppvObj)
+    {
+        if (ppvObj == NULL)
+            return E_POINTER;
+        if (IsEqualIID(iid, IID_IUnknown) || IsEqualIID(iid, IID_IDropTarget))
+        {
+            *ppvObj = (IDropTarget*)this;
+            AddRef();
+            return S_OK;
+        }
+        *ppvObj = NULL;
+        return E_NOINTERFACE;
+    }
+    STDMETHOD_(ULONG, AddRef)()
+    {
+        return (ULONG)::InterlockedIncrement(&m_nRef);
+    }
+    STDMETHOD_(ULONG, Release)()
+    {
+        LONG nRef = ::InterlockedDecrement(&m_nRef);
+        if (nRef == 0)
+        {
+            Disconnect();
+            delete this;
+        }
+        return (ULONG)nRef;
+    }
+    STDMETHOD(DragEnter)(LPDATAOBJECT lpDataObject, DWORD dwKeyState, POINTL pt, LPDWORD pdwEffect)
+    {
+        if (IDropTarget* pTarget = Target())
+            return pTarget->DragEnter(lpDataObject, dwKeyState, pt, pdwEffect);
+        return Refuse(pdwEffect);
+    }
+    STDMETHOD(DragOver)(DWORD dwKeyState, POINTL pt, LPDWORD pdwEffect)
+    {
+        if (IDropTarget* pTarget = Target())
+            return pTarget->DragOver(dwKeyState, pt, pdwEffect);
+        return Refuse(pdwEffect);
+    }
+    STDMETHOD(DragLeave)()
+    {
+        if (IDropTarget* pTarget = Target())
+            return pTarget->DragLeave();
+        return S_OK;
+    }
+    STDMETHOD(Drop)(LPDATAOBJECT lpDataObject, DWORD dwKeyState, POINTL pt, LPDWORD pdwEffect)
+    {
+        if (IDropTarget* pTarget = Target())
+            return pTarget->Drop(lpDataObject, dwKeyState, pt, pdwEffect);
+        return Refuse(pdwEffect);
+    }
+
+private:
+    virtual ~AFX_DROPTARGET_FORWARDER() {}
+
+    static HRESULT Refuse(LPDWORD pdwEffect)
+    {
+        if (pdwEffect != NULL)
+            *pdwEffect = DROPEFFECT_NONE;
+        return S_OK;
+    }
+
+    LONG m_nRef;
+    COleDropTarget* m_pTarget;
+};
+
 BEGIN_INTERFACE_MAP(COleDropTarget, CCmdTarget)
     INTERFACE_PART(COleDropTarget, IID_IDropTarget, DropTarget)
 END_INTERFACE_MAP()
 
 COleDropTarget::COleDropTarget()
-    : m_hWnd(NULL), m_lpDataObject(NULL)
+    : m_hWnd(NULL), m_lpDataObject(NULL), m_pForwarder(NULL)
 {
 }
 
@@ -163,11 +253,14 @@ BOOL COleDropTarget::Register(CWnd* pWnd)
     LPUNKNOWN lpUnknown = GetInterface(&IID_IUnknown);
     if (::CoLockObjectExternal(lpUnknown, TRUE, FALSE) != S_OK)
         return FALSE;
-    if (::RegisterDragDrop(pWnd->m_hWnd, (LPDROPTARGET)GetInterface(&IID_IDropTarget)) != S_OK)
+    AFX_DROPTARGET_FORWARDER* pForwarder = new AFX_DROPTARGET_FORWARDER(this);
+    if (::RegisterDragDrop(pWnd->m_hWnd, pForwarder) != S_OK)
     {
+        pForwarder->Release();
         ::CoLockObjectExternal(lpUnknown, FALSE, FALSE);
         return FALSE;
     }
+    m_pForwarder = pForwarder;
     m_hWnd = pWnd->m_hWnd;
     pWnd->m_pDropTarget = this;
     return TRUE;
@@ -178,6 +271,15 @@ void COleDropTarget::Revoke()
     if (m_hWnd == NULL)
         return;
     ::RevokeDragDrop(m_hWnd);
+    m_pForwarder->Disconnect();
+    m_pForwarder->Release();
+    m_pForwarder = NULL;
+    // a drag still over the window is over for this target
+    if (m_lpDataObject != NULL)
+    {
+        m_lpDataObject->Release();
+        m_lpDataObject = NULL;
+    }
     ::CoLockObjectExternal(GetInterface(&IID_IUnknown), FALSE, TRUE);
     if (CWnd* pWnd = CWnd::FromHandlePermanent(m_hWnd))
     {

@@ -655,6 +655,9 @@ static BOOL DispatchWndMsg(CWnd* pThis, const AFX_MSGMAP_ENTRY* lpEntry, UINT_PT
         (pThis->*AfxWndHandler<void (CWnd::*)(BOOL, NCCALCSIZE_PARAMS*)>(pfn))(
             (BOOL)wParam, (NCCALCSIZE_PARAMS*)lParam);
         break;
+    case AfxSig_bHELPINFO:
+        lResult = (pThis->*AfxWndHandler<BOOL (CWnd::*)(HELPINFO*)>(pfn))((HELPINFO*)lParam);
+        break;
     default:
         return FALSE;
     }

@@ -535,3 +535,20 @@ int CWnd::ScrollWindowEx(int dx, int dy, LPCRECT lpRectScroll, LPCRECT lpRectCli
     return ::ScrollWindowEx(m_hWnd, dx, dy, lpRectScroll, lpRectClip,
         RgnHandle(prgnUpdate), lpRectUpdate, flags);
 }
+
+// F1 in a top-level window without modifiers asks the main window for help
+// (ID_HELP); otherwise the system passes WM_HELP on to the parent.
+BOOL CWnd::OnHelpInfo(HELPINFO*)
+{
+    if (!(GetStyle() & WS_CHILD))
+    {
+        CWnd* pMainWnd = AfxGetMainWnd();
+        if (pMainWnd != NULL && ::GetKeyState(VK_SHIFT) >= 0 && ::GetKeyState(VK_CONTROL) >= 0
+            && ::GetKeyState(VK_MENU) >= 0)
+        {
+            pMainWnd->SendMessage(WM_COMMAND, ID_HELP);
+            return TRUE;
+        }
+    }
+    return (BOOL)Default();
+}
