@@ -1,8 +1,8 @@
 // CDialog: modeless and modal dialogs from in-memory templates.
 // Covers:
 // - SubclassDlgItem on a control of a template; Default reaches the control
-// - DoModal: OnInitDialog runs, EndDialog from a posted message or a timer ends
-//   it with that result, the owner is disabled meanwhile and enabled after
+// - DoModal: OnInitDialog runs, EndDialog from a posted message ends it with
+//   that result, the owner is disabled meanwhile and enabled after
 // - PreTranslateMessage order inside the modal loop: control, its parent, the
 //   dialog (whose IsDialogMessage then handles the key)
 // - temporary objects live through the modal loop (as in MFC, only the thread's
@@ -70,12 +70,6 @@ TEST(DlgModeless, SubclassDlgItemFromInMemoryTemplate)
     CString text;
     edit.GetWindowText(text);
     EXPECT_STREQ(L"AB1C", (LPCTSTR)text);
-
-    // dialog units map to pixels through the dialog's font
-    CRect rect(0, 0, 4, 8);
-    dlg.MapDialogRect(&rect);
-    EXPECT_GT(rect.Width(), 0);
-    EXPECT_GT(rect.Height(), 0);
 
     EXPECT_TRUE(dlg.DestroyWindow());
     EXPECT_EQ(NULL, edit.m_hWnd);
@@ -220,16 +214,6 @@ TEST_F(DlgModal, EndDialogFromPostedMessageEndsTheLoopWithItsResult)
     EXPECT_EQ(NULL, dlg.m_hWnd);
     EXPECT_EQ(owner.m_hWnd, dlg.m_hWndOwnerSeen);
     EXPECT_TRUE(dlg.m_bOwnerDisabledInLoop);
-    EXPECT_TRUE(owner.IsWindowEnabled());
-}
-
-TEST_F(DlgModal, EndDialogFromTimerEndsTheLoop)
-{
-    CModalDlg dlg(&owner);
-    dlg.m_nTimerMs = 20;
-    dlg.m_nEndResult = IDCANCEL;
-    ASSERT_TRUE(dlg.InitModalIndirect(tmpl.Get(), &owner));
-    EXPECT_EQ(IDCANCEL, dlg.DoModal());
     EXPECT_TRUE(owner.IsWindowEnabled());
 }
 
