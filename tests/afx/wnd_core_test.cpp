@@ -8,7 +8,8 @@
 // - Default() reaches the original procedure of a subclassed control;
 //   UnsubclassWindow restores it
 // - Attach/Detach and the permanent map; temporary objects freed at idle
-// - PostNcDestroy deleting the object; a window outliving its object
+// - a window outliving its object (PostNcDestroy deleting the object: the mini
+//   frame's test)
 #include <afxwin.h>
 #include <afxpriv.h>
 
@@ -336,30 +337,6 @@ TEST(WndHandleMap, TemporaryObjectsAreFreedAtIdle)
 
 /////////////////////////////////////////////////////////////////////////////
 // Object lifetime
-
-class CSelfDeletingWnd : public CWnd
-{
-public:
-    static int s_nLive;
-    CSelfDeletingWnd() { ++s_nLive; }
-    ~CSelfDeletingWnd() override { --s_nLive; }
-    void PostNcDestroy() override { delete this; }
-};
-int CSelfDeletingWnd::s_nLive = 0;
-
-TEST(WndLifetime, PostNcDestroyMayDeleteTheObject)
-{
-    for (int i = 0; i < 20; ++i)
-    {
-        CSelfDeletingWnd* pWnd = new CSelfDeletingWnd;
-        ASSERT_TRUE(pWnd->CreateEx(0, NULL, L"self", WS_POPUP, PopupRect(), NULL, 0));
-        HWND hWnd = pWnd->m_hWnd;
-        EXPECT_EQ(1, CSelfDeletingWnd::s_nLive);
-        ::DestroyWindow(hWnd);    // the object goes with its window
-        EXPECT_EQ(0, CSelfDeletingWnd::s_nLive);
-        EXPECT_EQ(nullptr, CWnd::FromHandlePermanent(hWnd));
-    }
-}
 
 TEST(WndLifetime, DestroyingTheObjectDestroysItsWindow)
 {
