@@ -8,7 +8,6 @@
 // - AfxMessageBox: shown with the application name as caption and the exact
 //   text, owned by the active top-level window (disabled meanwhile), returning
 //   the button that answered it
-// - the wait cursor count
 #include <afxwin.h>
 
 #include <gtest/gtest.h>
@@ -176,20 +175,6 @@ TEST(AppMessageBox, WithoutAnActiveWindowTheBoxHasNoOwner)
     EXPECT_EQ(IDCANCEL, AfxMessageBox(L"alone", MB_OKCANCEL));
     ASSERT_EQ(1u, owners.size());
     EXPECT_EQ(nullptr, owners[0]);
-}
-
-TEST(AppWaitCursor, BeginAndEndAreCounted)
-{
-    CWinApp* pApp = AfxGetApp();
-    CCmdTarget target;
-    target.BeginWaitCursor();
-    target.BeginWaitCursor();
-    EXPECT_EQ(2, pApp->m_nWaitCursorCount);
-    target.EndWaitCursor();
-    target.EndWaitCursor();
-    EXPECT_EQ(0, pApp->m_nWaitCursorCount);
-    target.EndWaitCursor();     // unbalanced end: stays at zero
-    EXPECT_EQ(0, pApp->m_nWaitCursorCount);
 }
 
 } // namespace

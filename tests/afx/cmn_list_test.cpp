@@ -1,10 +1,7 @@
-// afxcmn.h: what CListCtrl and CHeaderCtrl add to the controls' messages.
+// afxcmn.h: what CListCtrl adds to the control's messages (the rectangle parts, hit
+// tests, owner-drawn rows and the header's order array are exercised by the lists family):
 // - item texts of any length, and the buffer form's length;
-// - the rectangle part asked for (bounds, label, icon, sub-item) reaches the control;
-// - hit test flags;
-// - image lists owned by a CImageList survive the list's destruction;
-// - owner-drawn rows and header items reach DrawItem through reflection;
-// - the header's order array with its own item count.
+// - image lists owned by a CImageList survive the list's destruction.
 #include <afxwin.h>
 #include <afxcmn.h>
 
@@ -13,13 +10,6 @@
 #include <string>
 
 namespace {
-
-class CCountingList : public CListCtrl
-{
-public:
-    void DrawItem(LPDRAWITEMSTRUCT lpDrawItemStruct) override { m_nDrawn += lpDrawItemStruct->CtlType == ODT_LISTVIEW; }
-    int m_nDrawn = 0;
-};
 
 class ListCtrlTest : public testing::Test
 {
@@ -42,7 +32,7 @@ protected:
     }
 
     CWnd m_parent;
-    CCountingList m_list;
+    CListCtrl m_list;
 };
 
 TEST_F(ListCtrlTest, ItemTextsOfAnyLength)
@@ -57,22 +47,6 @@ TEST_F(ListCtrlTest, ItemTextsOfAnyLength)
     EXPECT_STREQ(_T(""), m_list.GetItemText(5, 0));
 }
 
-TEST_F(ListCtrlTest, RectanglePartsAndHitTest)
-{
-    CRect bounds, label, sub;
-    ASSERT_TRUE(m_list.GetItemRect(0, &bounds, LVIR_BOUNDS));
-    ASSERT_TRUE(m_list.GetItemRect(0, &label, LVIR_LABEL));
-    ASSERT_TRUE(m_list.GetSubItemRect(0, 1, LVIR_BOUNDS, sub));
-    EXPECT_EQ(200, bounds.Width());
-    EXPECT_EQ(120, label.right);
-    EXPECT_EQ(120, sub.left);
-
-    UINT flags = 0;
-    EXPECT_EQ(0, m_list.HitTest(label.CenterPoint(), &flags));
-    EXPECT_EQ(static_cast<UINT>(LVHT_ONITEMLABEL), flags);
-    EXPECT_EQ(-1, m_list.HitTest(CPoint(250, 150), &flags));
-}
-
 TEST_F(ListCtrlTest, OwnedImageListOutlivesTheList)
 {
     CImageList images;
@@ -83,26 +57,6 @@ TEST_F(ListCtrlTest, OwnedImageListOutlivesTheList)
     int cx = 0, cy = 0;
     EXPECT_TRUE(::ImageList_GetIconSize(images.m_hImageList, &cx, &cy));
     EXPECT_EQ(16, cx);
-}
-
-TEST_F(ListCtrlTest, OwnerDrawnRowsReachDrawItem)
-{
-    m_list.ModifyStyle(0, LVS_OWNERDRAWFIXED);
-    m_list.Invalidate();
-    m_list.UpdateWindow();
-    EXPECT_EQ(1, m_list.m_nDrawn);
-}
-
-TEST_F(ListCtrlTest, HeaderOrderArrayWithItsOwnCount)
-{
-    CHeaderCtrl* pHeader = m_list.GetHeaderCtrl();
-    ASSERT_NE(nullptr, pHeader);
-    int order[2] = { 1, 0 };
-    ASSERT_TRUE(pHeader->SetOrderArray(2, order));
-    int back[2] = {};
-    ASSERT_TRUE(pHeader->GetOrderArray(back));
-    EXPECT_EQ(1, back[0]);
-    EXPECT_EQ(0, back[1]);
 }
 
 } // namespace

@@ -4,7 +4,7 @@
 // - the insertion overload that fills mask, state and data; check boxes from state images;
 // - image lists: permanent and temporary wrappers, Attach/Detach, DeleteImageList;
 // - the tree's image lists returned as wrappers and released when the tree goes; drag
-//   images owned by the caller; EditLabel's edit control.
+//   images owned by the caller.
 #include <afxwin.h>
 #include <afxcmn.h>
 
@@ -101,7 +101,7 @@ TEST(ImageListTest, PermanentAndTemporaryWrappersAttachDetachAndRelease)
     EXPECT_EQ(nullptr, CImageList::FromHandlePermanent(raw));
 }
 
-TEST_F(TreeCtrlTest, ImageListsDragImagesAndTheLabelEdit)
+TEST_F(TreeCtrlTest, ImageListsAndDragImages)
 {
     CImageList images;
     ASSERT_TRUE(images.Create(16, 16, ILC_COLOR24, 1, 1));
@@ -119,16 +119,6 @@ TEST_F(TreeCtrlTest, ImageListsDragImagesAndTheLabelEdit)
     delete pDrag;
     EXPECT_EQ(nullptr, CImageList::FromHandlePermanent(hDrag));
     EXPECT_EQ(nullptr, m_tree.CreateDragImage(NULL));
-
-    m_tree.SetFocus();
-    CEdit* pEdit = m_tree.EditLabel(h);
-    ASSERT_NE(nullptr, pEdit);
-    EXPECT_EQ(pEdit->m_hWnd, m_tree.GetEditControl()->m_hWnd);
-    CString text;
-    pEdit->GetWindowText(text);
-    EXPECT_STREQ(_T("drag me"), text);
-    m_tree.SendMessage(TVM_ENDEDITLABELNOW, TRUE, 0);
-    EXPECT_EQ(nullptr, m_tree.GetEditControl());
 
     // The tree lets go of the image lists when it goes; the object keeps its own.
     m_tree.DestroyWindow();

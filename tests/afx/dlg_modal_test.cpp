@@ -1,8 +1,8 @@
-// CDialog: modeless and modal dialogs from in-memory templates.
+// CDialog: modal dialogs from in-memory templates (modeless ones with subclassed items
+// are every edits test's page).
 // Covers:
-// - SubclassDlgItem on a control of a template; Default reaches the control
-// - DoModal: OnInitDialog runs, EndDialog from a posted message or a timer ends
-//   it with that result, the owner is disabled meanwhile and enabled after
+// - DoModal: OnInitDialog runs, EndDialog from a posted message ends it with
+//   that result, the owner is disabled meanwhile and enabled after
 // - PreTranslateMessage order inside the modal loop: control, its parent, the
 //   dialog (whose IsDialogMessage then handles the key)
 // - temporary objects live through the modal loop (as in MFC, only the thread's
@@ -33,53 +33,6 @@ DialogTemplate MakeTemplate()
     tmpl.AddItem(IDOK, DialogTemplate::Button, L"OK", 10, 40, 50, 14, BS_DEFPUSHBUTTON | WS_TABSTOP);
     tmpl.AddItem(IDCANCEL, DialogTemplate::Button, L"Cancel", 70, 40, 50, 14, BS_PUSHBUTTON | WS_TABSTOP);
     return tmpl;
-}
-
-class CUpperEdit : public CEdit
-{
-public:
-    afx_msg void OnChar(UINT nChar, UINT, UINT)
-    {
-        // the original procedure inserts the character it is given
-        const MSG* pMsg = GetCurrentMessage();
-        if (nChar >= 'a' && nChar <= 'z')
-            DefWindowProc(WM_CHAR, nChar - 'a' + 'A', pMsg->lParam);
-        else
-            Default();
-    }
-    DECLARE_MESSAGE_MAP()
-};
-
-BEGIN_MESSAGE_MAP(CUpperEdit, CEdit)
-    ON_WM_CHAR()
-END_MESSAGE_MAP()
-
-TEST(DlgModeless, SubclassDlgItemFromInMemoryTemplate)
-{
-    DialogTemplate tmpl = MakeTemplate();
-    CDialog dlg;
-    ASSERT_TRUE(dlg.CreateIndirect(tmpl.Get()));
-    ASSERT_NE(nullptr, dlg.m_hWnd);
-    EXPECT_EQ(&dlg, CWnd::FromHandlePermanent(dlg.m_hWnd));
-
-    CUpperEdit edit;
-    ASSERT_TRUE(edit.SubclassDlgItem(kEditId, &dlg));
-    EXPECT_EQ(&edit, dlg.GetDlgItem(kEditId));
-    EXPECT_FALSE(CUpperEdit().SubclassDlgItem(4242, &dlg));
-    orvane_test::SendChars(edit.m_hWnd, L"ab1c");
-    CString text;
-    edit.GetWindowText(text);
-    EXPECT_STREQ(L"AB1C", (LPCTSTR)text);
-
-    // dialog units map to pixels through the dialog's font
-    CRect rect(0, 0, 4, 8);
-    dlg.MapDialogRect(&rect);
-    EXPECT_GT(rect.Width(), 0);
-    EXPECT_GT(rect.Height(), 0);
-
-    EXPECT_TRUE(dlg.DestroyWindow());
-    EXPECT_EQ(NULL, edit.m_hWnd);
-    EXPECT_EQ(NULL, dlg.m_hWnd);
 }
 
 /////////////////////////////////////////////////////////////////////////////
@@ -220,16 +173,6 @@ TEST_F(DlgModal, EndDialogFromPostedMessageEndsTheLoopWithItsResult)
     EXPECT_EQ(NULL, dlg.m_hWnd);
     EXPECT_EQ(owner.m_hWnd, dlg.m_hWndOwnerSeen);
     EXPECT_TRUE(dlg.m_bOwnerDisabledInLoop);
-    EXPECT_TRUE(owner.IsWindowEnabled());
-}
-
-TEST_F(DlgModal, EndDialogFromTimerEndsTheLoop)
-{
-    CModalDlg dlg(&owner);
-    dlg.m_nTimerMs = 20;
-    dlg.m_nEndResult = IDCANCEL;
-    ASSERT_TRUE(dlg.InitModalIndirect(tmpl.Get(), &owner));
-    EXPECT_EQ(IDCANCEL, dlg.DoModal());
     EXPECT_TRUE(owner.IsWindowEnabled());
 }
 

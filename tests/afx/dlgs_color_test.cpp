@@ -1,10 +1,8 @@
 // CColorDialog (afxdlgs.h):
 //  - construction: the CHOOSECOLOR record MFC fills (size, hook, flags, RGB init only for
 //    a non-black colour, the shared custom colours);
-//  - the dialog window is attached to the object while it runs: OnInitDialog of a derived
-//    class runs once with the window, OnOK is routed through the object, and the object
-//    lets go of the window afterwards;
-//  - SetCurrentColor while running, OnColorOK keeping the dialog open.
+//  - SetCurrentColor while running, OnColorOK keeping the dialog open (the window attached
+//    to the object while it runs, OnInitDialog and OK: KVXColorDialog's tests, buttons).
 #include <afxwin.h>
 #include <afxdlgs.h>
 
@@ -20,15 +18,6 @@
 namespace {
 
 using DialogSteps = orvane_test::ModalScript;
-
-bool TypeColourAndOk(HWND hDlg, int r, int g, int b)
-{
-    ::SetDlgItemInt(hDlg, 706, r, FALSE);
-    ::SetDlgItemInt(hDlg, 707, g, FALSE);
-    ::SetDlgItemInt(hDlg, 708, b, FALSE);
-    ::PostMessage(hDlg, WM_COMMAND, IDOK, 0);
-    return true;
-}
 
 TEST(CColorDialogTest, ConstructionFillsTheRecord)
 {
@@ -51,28 +40,11 @@ TEST(CColorDialogTest, ConstructionFillsTheRecord)
     EXPECT_EQ(pCustom, CColorDialog::GetSavedCustomColors());
 }
 
-// A derived dialog that records what reaches the object.
+// A derived dialog that records the colours its OnColorOK sees.
 class CRecordingColorDialog : public CColorDialog
 {
 public:
     CRecordingColorDialog() : CColorDialog(0, CC_FULLOPEN) {}
-
-    virtual BOOL OnInitDialog()
-    {
-        ++m_nInit;
-        m_hWndAtInit = m_hWnd;
-        m_bAttachedAtInit = CWnd::FromHandlePermanent(m_hWnd) == this;
-        CColorDialog::OnInitDialog();
-        if (m_clrSetAtInit != CLR_INVALID)
-            SetCurrentColor(m_clrSetAtInit);
-        return TRUE;
-    }
-
-    virtual void OnOK()
-    {
-        ++m_nOk;
-        CColorDialog::OnOK();
-    }
 
     virtual BOOL OnColorOK()
     {
@@ -80,33 +52,9 @@ public:
         return m_nRejects-- > 0;
     }
 
-    int m_nInit = 0;
-    int m_nOk = 0;
     int m_nRejects = 0;
-    HWND m_hWndAtInit = NULL;
-    bool m_bAttachedAtInit = false;
-    COLORREF m_clrSetAtInit = CLR_INVALID;
     std::vector<COLORREF> m_colorsAtColorOk;
 };
-
-// DoModal answered OK with a typed colour and cancelled is KVXColorDialog's test too (buttons).
-TEST(CColorDialogTest, TheObjectGetsTheDialogsMessages)
-{
-    CRecordingColorDialog dlg;
-    HWND hSeen = NULL;
-    DialogSteps steps({ [&](HWND h) {
-        hSeen = h;
-        return TypeColourAndOk(h, 0, 128, 255);
-    } });
-    EXPECT_EQ(IDOK, dlg.DoModal());
-    EXPECT_EQ(1, dlg.m_nInit);
-    EXPECT_EQ(hSeen, dlg.m_hWndAtInit);
-    EXPECT_TRUE(dlg.m_bAttachedAtInit);
-    EXPECT_EQ(1, dlg.m_nOk);
-    EXPECT_EQ(RGB(0, 128, 255), dlg.GetColor());
-    EXPECT_EQ(nullptr, dlg.m_hWnd);
-    EXPECT_EQ(nullptr, CWnd::FromHandlePermanent(hSeen));
-}
 
 // Wine 8's colour dialog neither handles SETRGBSTRING nor sends COLOROKSTRING to the
 // hook: the tests check the framework's side of both (the message sent to the running

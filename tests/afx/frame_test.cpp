@@ -7,7 +7,8 @@
 // - a frame deletes itself when its window goes with its owner, and when its
 //   creation fails
 // - CWaitCursor: nested waits, Restore after the cursor was changed, the
-//   cursor from before the first wait comes back after the last
+//   cursor from before the first wait comes back after the last; an unbalanced
+//   end leaves the count at zero
 #include <afxwin.h>
 
 #include <gtest/gtest.h>
@@ -106,6 +107,8 @@ TEST(WaitCursor, NestedWaitsKeepItUntilTheLastEnds)
         EXPECT_EQ(hWait, ::GetCursor());
     }
     EXPECT_EQ(hArrow, ::GetCursor());
+    EXPECT_EQ(0, AfxGetApp()->m_nWaitCursorCount);
+    CCmdTarget().EndWaitCursor();
     EXPECT_EQ(0, AfxGetApp()->m_nWaitCursorCount);
 }
 

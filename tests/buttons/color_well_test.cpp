@@ -77,6 +77,15 @@ void PostKeyToFocus(UINT vk)
     ::PostMessage(::GetFocus(), WM_KEYUP, vk, 0xC0000001);
 }
 
+// A popup step that sends one mouse message at a client point of the popup.
+ModalScript::Step Mouse(UINT message, WPARAM keys, POINT pt)
+{
+    return [=](HWND hPopup) {
+        ::SendMessage(hPopup, message, keys, PointParam(pt.x, pt.y));
+        return true;
+    };
+}
+
 std::wstring Caption(HWND hwnd) { return orvane_test::WindowText(hwnd); }
 bool IsColorDialog(HWND hwnd) { return ::GetDlgItem(hwnd, 706) != NULL; }
 
@@ -169,7 +178,9 @@ TEST_F(ColorWellTest, DrawingPerState)
             EXPECT_EQ(Hex(expected), Hex(cap.At(p.x, p.y))) << state << " at " << p.x << "," << p.y;
         }
         if (state == "disabled")
+        {
             EXPECT_EQ(60 * 16, cap.Count(RECT{ 5, 4, 65, 20 }, Face())) << "no swatch when disabled";
+        }
     }
 }
 
@@ -279,11 +290,7 @@ TEST_F(ColorWellTest, HoverAndPickRow1Column2GivesWhiteOnceAlsoWhenOpenedByAClic
     EXPECT_EQ(0x42Au, reinterpret_cast<const NMHDR*>(m_spy->payloads()[0].data())->code);
     EXPECT_EQ(Hex(0xFFFFFF), Hex(ClientCapture(m_well.m_hWnd).At(30, 12)));
 
-    ModalScript script({ [&](HWND hPopup) {
-        const POINT pt = Grid().Centre(2);
-        ::SendMessage(hPopup, WM_LBUTTONUP, 0, PointParam(pt.x, pt.y));
-        return true;
-    } });
+    ModalScript script({ Mouse(WM_LBUTTONUP, 0, Grid().Centre(2)) });
     ::SendMessage(m_well.m_hWnd, WM_LBUTTONDOWN, MK_LBUTTON, PointParam(10, 10));
     ::SendMessage(m_well.m_hWnd, WM_LBUTTONUP, 0, PointParam(10, 10));
     EXPECT_TRUE(script.finished());
@@ -298,11 +305,8 @@ TEST_F(ColorWellTest, ReleaseOnAGapKeepsTheColourAndStillNotifiesOnAnEmptyCellPi
     m_well.SetColor(0x808000);   // teal, cell 13
     Grid grid;
     grid.gap = 6;
-    RunPopup({ [&](HWND hPopup) {
-        const RECT rc = grid.Button(5);
-        ::SendMessage(hPopup, WM_LBUTTONUP, 0, PointParam(rc.right + 2, rc.top + 5));
-        return true;
-    } });
+    const RECT rc = grid.Button(5);
+    RunPopup({ Mouse(WM_LBUTTONUP, 0, POINT{ rc.right + 2, rc.top + 5 }) });
     EXPECT_EQ(Hex(0x808000), Hex(m_well.GetColor()));
     ASSERT_EQ(1, m_spy->count());
     EXPECT_EQ(Hex(0x808000), Hex(Notified(0)));
@@ -312,11 +316,7 @@ TEST_F(ColorWellTest, ReleaseOnAGapKeepsTheColourAndStillNotifiesOnAnEmptyCellPi
     m_well.GetColorArray()->SetSize(10);
     m_well.GetColorArray()->SetAt(9, RGB(1, 2, 3));
     for (int cell : { 15, 9 })   // the shortened palette persists between openings
-        RunPopup({ [&](HWND hPopup) {
-            const POINT pt = Grid().Centre(cell);
-            ::SendMessage(hPopup, WM_LBUTTONUP, 0, PointParam(pt.x, pt.y));
-            return true;
-        } });
+        RunPopup({ Mouse(WM_LBUTTONUP, 0, Grid().Centre(cell)) });
     EXPECT_EQ(Hex(RGB(1, 2, 3)), Hex(m_well.GetColor()));
     EXPECT_EQ(Hex(0x808000), Hex(Notified(1))) << "the empty cell picked nothing";
 }
@@ -333,14 +333,8 @@ TEST_F(ColorWellTest, EscapeAndClicksOutsideCancelSilentlyAnUndefinedColourHasNo
     } });
     EXPECT_EQ(-1, raised);
     EXPECT_EQ(-1, sunken);
-    RunPopup({ [&](HWND hPopup) {
-        ::SendMessage(hPopup, WM_LBUTTONDOWN, MK_LBUTTON, PointParam(200, 5));
-        return true;
-    } });
-    RunPopup({ [&](HWND hPopup) {
-        ::SendMessage(hPopup, WM_LBUTTONUP, 0, PointParam(-5, -5));
-        return true;
-    } });
+    RunPopup({ Mouse(WM_LBUTTONDOWN, MK_LBUTTON, POINT{ 200, 5 }) });
+    RunPopup({ Mouse(WM_LBUTTONUP, 0, POINT{ -5, -5 }) });
     EXPECT_EQ(0, m_spy->count());
     EXPECT_TRUE(m_well.GetColorUndefined());
 }

@@ -2,7 +2,6 @@
 //  - colour palette grid: cell rectangles, hover and release hit tests (gaps, margins,
 //    outside), popup size and Other... button place, keeping the popup on screen;
 //  - keyboard moves of the popup's hover, with and without the Other... button;
-//  - setter ranges of the palette settings;
 //  - bitmap buttons: bitmap and colour map chosen per kind and state, centring.
 #include "ButtonLook.h"
 #include "ColorGridGeometry.h"
@@ -213,22 +212,6 @@ TEST(ColorPopupKeysOther, OtherKeysAreNotMoves)
     EXPECT_FALSE(ColorGridGeometry::MoveHoverByKey(ColorGridLayout(), 3, VK_ESCAPE, true, hover));
     EXPECT_FALSE(ColorGridGeometry::MoveHoverByKey(ColorGridLayout(), 3, VK_RETURN, true, hover));
     EXPECT_EQ(7, hover);
-}
-
-TEST(ColorPopupSettings, Ranges)
-{
-    for (long n : { 0L, 21L })
-        EXPECT_FALSE(ColorGridGeometry::IsValidGridCount(n)) << n;
-    for (long n : { 1L, 20L })
-        EXPECT_TRUE(ColorGridGeometry::IsValidGridCount(n)) << n;
-    for (long n : { 9L, 101L })
-        EXPECT_FALSE(ColorGridGeometry::IsValidButtonExtent(n)) << n;
-    for (long n : { 10L, 100L })
-        EXPECT_TRUE(ColorGridGeometry::IsValidButtonExtent(n)) << n;
-    for (long n : { -1L, 101L })
-        EXPECT_FALSE(ColorGridGeometry::IsValidGridSpacing(n)) << n;
-    for (long n : { 0L, 100L })
-        EXPECT_TRUE(ColorGridGeometry::IsValidGridSpacing(n)) << n;
 }
 
 // ---------------------------------------------------------------------------

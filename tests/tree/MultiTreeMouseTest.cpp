@@ -8,12 +8,11 @@
 // - the anchor across presses and deletion; TVS_DISABLEDRAGDROP; labels-only banding;
 // - expand button and state icon handed to the tree; the right button;
 // - a press ended by Escape, by a lost capture or by WM_QUIT;
-// - band geometry against the tree's own rows; auto-scroll by move and by timer ticks;
+// - auto-scroll by move and by timer ticks (the band's row test is BandTouches' table);
 // - the highlight of every selected label, not only the caret's, follows the focus.
 #include "TreeHarness.h"
 
 #include "Input.h"
-#include "TreeSelectionMath.h"
 
 #include <sstream>
 
@@ -354,33 +353,6 @@ protected:
     CRect m_rcClient;
     int m_nItemHeight = 0;
 };
-
-TEST_F(ScrollingBandTest, BandOnEachRowEdgeSelectsThatRowOnly)
-{
-    m_tree.ShowWindow(SW_HIDE);   // geometry only: no repainting per change
-    for (const char* name : { "I3", "I10", "I11" })
-    {
-        TVITEMEXW item = {};
-        item.mask = TVIF_HANDLE | TVIF_INTEGRAL;
-        item.hItem = Item(name);
-        item.iIntegral = name[2] == '0' ? 3 : 2;
-        ASSERT_TRUE(m_tree.SendMessage(TVM_SETITEMW, 0, reinterpret_cast<LPARAM>(&item)));
-    }
-    ScrollTo(6);   // rows above the client area too
-    for (HTREEITEM h = m_tree.GetRootItem(); h != NULL; h = m_tree.GetNextVisibleItem(h))
-    {
-        CRect rc;
-        ASSERT_TRUE(m_tree.GetItemRect(h, &rc, FALSE));
-        for (int y : { int(rc.top), int(rc.bottom) - 1 })
-        {
-            Arrange("", "");
-            TreeSelectionMath::SelectionSnapshot none;
-            const CRect band(5, y, 9, y);
-            m_tree.UpdateSelectionForRect(&band, 0, none);
-            EXPECT_EQ(ItemName(m_tree, h), Selected()) << "row line " << y;
-        }
-    }
-}
 
 TEST_F(ScrollingBandTest, MovesAndTicksOutsideTheClientAreaScrollKeepingTheStartInContent)
 {

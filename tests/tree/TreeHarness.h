@@ -47,7 +47,6 @@ class CTestTree : public CMultiTree
 {
 public:
     using CMultiTree::OnButtonDown;
-    using CMultiTree::UpdateSelectionForRect;
 
     HTREEITEM Anchor() const { return m_hAnchorItem; }
     void SetAnchor(HTREEITEM hItem) { m_hAnchorItem = hItem; }

@@ -1,6 +1,6 @@
 // The classes of the value-types module:
 //  - KVXString: GetAs and GetBase reach the grammar with the whole text (the grammar itself is
-//    tested in number_text_test.cpp), Format, the grammar characters, CString behaviour kept;
+//    tested in number_text_test.cpp), Format, the grammar characters;
 //  - KVXVariant: COleVariant equality, copies that own their text, conversions (empty -> 0,
 //    rounding, overflow, text through the grammar, by-reference values), failures leave the
 //    out value alone;
@@ -76,24 +76,7 @@ TEST(KVXStringFormat, PrintfStyleAndTheGrammarCharacters)
     FormatTypeProbe probe;
     EXPECT_EQ(TRUE, probe.Probe(L'T'));
     EXPECT_EQ(FALSE, probe.Probe(L'a'));
-}
-
-TEST(KVXStringBasics, BehavesAsCString)
-{
-    static_assert(sizeof(KVXString) == sizeof(CString), "KVXString adds no data");
-    CString plain(L"abc");
-    KVXString copy(plain);
-    EXPECT_EQ(L"abc", Text(copy));
-    KVXString other = copy;
-    other += L"d";
-    EXPECT_EQ(L"abc", Text(copy));
-    EXPECT_EQ(L"abcd", Text(other));
-    other = plain;
-    EXPECT_EQ(L"abc", Text(other));
-    other = "narrow";
-    EXPECT_EQ(L"narrow", Text(other));
-    KVXString repeated(L'x', 3);
-    EXPECT_EQ(L"xxx", Text(repeated));
+    EXPECT_EQ(L"xxx", Text(KVXString(L'x', 3)));
 }
 
 /////////////////////////////////////////////////////////////////////////////
