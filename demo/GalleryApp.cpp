@@ -97,6 +97,35 @@ CString FileNameOf(LPCTSTR title)
 
 } // namespace
 
+CFont* CGalleryPage::GuiFont()
+{
+    return CFont::FromHandle(static_cast<HFONT>(::GetStockObject(DEFAULT_GUI_FONT)));
+}
+
+bool CGalleryPage::InScreenshotMode()
+{
+    return wcsstr(::GetCommandLineW(), L"/screenshots") != nullptr;
+}
+
+void CGalleryPage::CreateCheckBoxImages(CImageList& images, CWnd* pWnd)
+{
+    images.Create(16, 16, ILC_COLOR24 | ILC_MASK, 2, 0);
+    CClientDC screen(pWnd);
+    for (int i = 0; i < 2; ++i)
+    {
+        CDC dc;
+        dc.CreateCompatibleDC(&screen);
+        CBitmap bitmap;
+        bitmap.CreateCompatibleBitmap(&screen, 16, 16);
+        CBitmap* pOldBitmap = dc.SelectObject(&bitmap);
+        dc.FillSolidRect(0, 0, 16, 16, ::GetSysColor(COLOR_WINDOW));
+        CRect box(2, 2, 15, 15);
+        dc.DrawFrameControl(&box, DFC_BUTTON, DFCS_BUTTONCHECK | DFCS_FLAT | (i == 1 ? DFCS_CHECKED : 0));
+        dc.SelectObject(pOldBitmap);
+        images.Add(&bitmap, RGB(255, 0, 255));
+    }
+}
+
 GalleryPageEntry::GalleryPageEntry(int order_, GalleryPageFactory factory_)
     : order(order_), factory(factory_), next(nullptr)
 {

@@ -3,10 +3,19 @@
 #pragma once
 
 #include <afxwin.h>
+#include <afxcmn.h>
 
 class CGalleryPage : public CWnd
 {
 public:
+    // The font of the page's labels and buttons.
+    static CFont* GuiFont();
+    // Whether the gallery runs to write its screenshots ("/screenshots <folder>").
+    static bool InScreenshotMode();
+    // State images of check boxes: 1 a clear box, 2 a checked one, as the system draws
+    // check buttons, in a 16 x 16 image list created here.
+    static void CreateCheckBoxImages(CImageList& images, CWnd* pWnd);
+
     // Text of the page's tab.
     virtual LPCTSTR GetTitle() const = 0;
     // Creates the page's controls; the page window exists and has its final size.

@@ -113,16 +113,6 @@ int FieldOf(const CString& title)
     return -1;
 }
 
-bool InScreenshotMode()
-{
-    return wcsstr(::GetCommandLineW(), L"/screenshots") != nullptr;
-}
-
-CFont* GuiFont()
-{
-    return CFont::FromHandle(static_cast<HFONT>(::GetStockObject(DEFAULT_GUI_FONT)));
-}
-
 } // namespace
 
 // The page's list: reaches its chooser, and in screenshot mode draws the insertion

@@ -36,16 +36,6 @@ const int kComboBoxIdBase = 5106;
 // The state a checked row's check box has (state image 2).
 const UINT kCheckedState = INDEXTOSTATEIMAGEMASK(2);
 
-CFont* GuiFont()
-{
-    return CFont::FromHandle(static_cast<HFONT>(::GetStockObject(DEFAULT_GUI_FONT)));
-}
-
-bool InScreenshotMode()
-{
-    return wcsstr(::GetCommandLineW(), L"/screenshots") != nullptr;
-}
-
 } // namespace
 
 class CComboListPage : public CGalleryPage
@@ -67,7 +57,6 @@ private:
     enum { IDC_LIST = 700, IDC_REPORTS, IDC_SELECT_CHECKED, IDC_SELECT_NONE };
     static const UINT kDemonstrateMessage = WM_APP + 30;
 
-    void CreateCheckImages();
     void Fill();
     void Report(const CString& strLine);
 
@@ -107,7 +96,7 @@ void CComboListPage::CreateControls()
                     CRect(12, 44, nPaneLeft - 12, rc.bottom - 12), this, IDC_LIST);
     m_list.SetFont(GuiFont());
     m_list.SetExtendedStyle(LVS_EX_FULLROWSELECT);
-    CreateCheckImages();
+    CreateCheckBoxImages(m_checks, this);
     m_list.SetImageList(&m_checks, LVSIL_STATE);
     m_list.InsertColumn(0, _T("Task"), LVCFMT_LEFT, 170, 0);
     m_list.InsertColumn(1, _T("Status"), LVCFMT_LEFT, 110, 1);
@@ -129,26 +118,6 @@ void CComboListPage::CreateControls()
     m_selectNone.Create(_T("Select none"), WS_CHILD | WS_VISIBLE | BS_PUSHBUTTON,
                         CRect(nPaneLeft, rc.bottom - 38, rc.right - 12, rc.bottom - 14), this, IDC_SELECT_NONE);
     m_selectNone.SetFont(GuiFont());
-}
-
-void CComboListPage::CreateCheckImages()
-{
-    // State image 1 a clear box, 2 a checked one; a click on it toggles (KVXListCtrlEx).
-    m_checks.Create(16, 16, ILC_COLOR24 | ILC_MASK, 2, 0);
-    CClientDC screen(this);
-    for (int i = 0; i < 2; ++i)
-    {
-        CDC dc;
-        dc.CreateCompatibleDC(&screen);
-        CBitmap bitmap;
-        bitmap.CreateCompatibleBitmap(&screen, 16, 16);
-        CBitmap* pOldBitmap = dc.SelectObject(&bitmap);
-        dc.FillSolidRect(0, 0, 16, 16, ::GetSysColor(COLOR_WINDOW));
-        CRect box(2, 2, 15, 15);
-        dc.DrawFrameControl(&box, DFC_BUTTON, DFCS_BUTTONCHECK | DFCS_FLAT | (i == 1 ? DFCS_CHECKED : 0));
-        dc.SelectObject(pOldBitmap);
-        m_checks.Add(&bitmap, RGB(255, 0, 255));
-    }
 }
 
 void CComboListPage::Fill()

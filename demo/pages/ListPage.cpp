@@ -50,17 +50,8 @@ const int kInvalidEvery = 13;
 // In screenshot mode the pointer rests on the first long folder from this row in view on.
 const int kScreenshotRow = 4;
 
-bool InScreenshotMode()
-{
-    return wcsstr(::GetCommandLineW(), L"/screenshots") != nullptr;
-}
 const COLORREF kFlagColors[] = { RGB(200, 40, 40), RGB(240, 160, 20), RGB(40, 160, 60), RGB(50, 90, 200) };
 const int kFlagCount = sizeof kFlagColors / sizeof kFlagColors[0];
-
-CFont* GuiFont()
-{
-    return CFont::FromHandle(static_cast<HFONT>(::GetStockObject(DEFAULT_GUI_FONT)));
-}
 
 } // namespace
 
@@ -183,7 +174,6 @@ private:
     // its first nKeepFirst parts and as many of its last parts as fit, "..." between.
     CString AbbreviatePath(CString strText, int nMaxLength, int nKeepFirst);
     void CreateFlagImages();
-    void CreateCheckImages();
     void Fill();
 
     CWnd m_label;
@@ -234,7 +224,7 @@ void CListPage::CreateControls()
     m_list.SetFont(GuiFont());
     m_list.SetExtendedStyle(LVS_EX_FULLROWSELECT | LVS_EX_SUBITEMIMAGES);
     CreateFlagImages();
-    CreateCheckImages();
+    CreateCheckBoxImages(m_checks, this);
     m_list.SetImageList(&m_flags, LVSIL_SMALL);
     m_list.SetImageList(&m_checks, LVSIL_STATE);
     m_list.SetAbbreviateName(static_cast<CString (CWnd::*)(CString, int, int)>(&CListPage::AbbreviatePath));
@@ -282,26 +272,6 @@ void CListPage::CreateFlagImages()
         dc.SelectObject(pOldBrush);
         dc.SelectObject(pOldBitmap);
         m_flags.Add(&bitmap, kMask);
-    }
-}
-
-void CListPage::CreateCheckImages()
-{
-    // State image 1 a clear box, 2 a checked one, as the system draws check buttons.
-    m_checks.Create(16, 16, ILC_COLOR24 | ILC_MASK, 2, 0);
-    CClientDC screen(this);
-    for (int i = 0; i < 2; ++i)
-    {
-        CDC dc;
-        dc.CreateCompatibleDC(&screen);
-        CBitmap bitmap;
-        bitmap.CreateCompatibleBitmap(&screen, 16, 16);
-        CBitmap* pOldBitmap = dc.SelectObject(&bitmap);
-        dc.FillSolidRect(0, 0, 16, 16, ::GetSysColor(COLOR_WINDOW));
-        CRect box(2, 2, 15, 15);
-        dc.DrawFrameControl(&box, DFC_BUTTON, DFCS_BUTTONCHECK | DFCS_FLAT | (i == 1 ? DFCS_CHECKED : 0));
-        dc.SelectObject(pOldBitmap);
-        m_checks.Add(&bitmap, RGB(255, 0, 255));
     }
 }
 

@@ -71,15 +71,6 @@ BEGIN_MESSAGE_MAP(CSmallControlsPage, CGalleryPage)
     ON_MESSAGE(WM_KVX_COLORWELLCHANGED, &CSmallControlsPage::OnColorChanged)
 END_MESSAGE_MAP()
 
-namespace {
-
-CFont* GuiFont()
-{
-    return CFont::FromHandle(static_cast<HFONT>(::GetStockObject(DEFAULT_GUI_FONT)));
-}
-
-} // namespace
-
 void CSmallControlsPage::AddLabel(CWnd& label, LPCTSTR text, const CRect& rc)
 {
     label.Create(_T("STATIC"), text, WS_CHILD | WS_VISIBLE, rc, this, 0xFFFF);

@@ -27,7 +27,6 @@ private:
     enum { kLabelCount = 7, kLongLabel = kLabelCount - 1, kScreenshotLabel = 1 };
 
     void AddLabel(CWnd& label, LPCTSTR text, const CRect& rc, DWORD style = SS_ENDELLIPSIS);
-    static bool InScreenshotMode();
 
     CWnd m_intro;
     CWnd m_labels[kLabelCount];
@@ -43,20 +42,6 @@ BEGIN_MESSAGE_MAP(CToolTipPage, CGalleryPage)
     ON_MESSAGE(WM_GETFONT, &CToolTipPage::OnGetFont)
     ON_MESSAGE(kPointAtLabelMessage, &CToolTipPage::OnPointAtLabel)
 END_MESSAGE_MAP()
-
-namespace {
-
-CFont* GuiFont()
-{
-    return CFont::FromHandle(static_cast<HFONT>(::GetStockObject(DEFAULT_GUI_FONT)));
-}
-
-} // namespace
-
-bool CToolTipPage::InScreenshotMode()
-{
-    return wcsstr(::GetCommandLineW(), L"/screenshots") != nullptr;
-}
 
 void CToolTipPage::AddLabel(CWnd& label, LPCTSTR text, const CRect& rc, DWORD style)
 {
