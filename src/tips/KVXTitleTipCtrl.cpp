@@ -39,8 +39,7 @@ END_MESSAGE_MAP()
 BOOL KVXTitleTipCtrl::Create(CWnd* pParentWnd)
 {
     m_pParentWnd = pParentWnd;
-    return CWnd::CreateEx(WS_EX_TOPMOST | WS_EX_TOOLWINDOW, kClassName, NULL, WS_POPUP | WS_BORDER,
-                          0, 0, 0, 0, NULL, NULL);
+    return TipWindowSupport::CreateTip(this, kClassName);
 }
 
 BOOL KVXTitleTipCtrl::PreCreateWindow(CREATESTRUCT& cs)
@@ -54,12 +53,8 @@ BOOL KVXTitleTipCtrl::PreCreateWindow(CREATESTRUCT& cs)
 
 void KVXTitleTipCtrl::Show(CRect rect, const wchar_t* text, int nTextOffset)
 {
-    if (m_hWnd == NULL || m_pParentWnd == NULL || IsWindowVisible())
-        return;
-    if (CWnd::GetFocus() == NULL)
-        return;   // tips only appear in the active application
-    const CString strText(text != NULL ? text : L"");
-    if (strText.IsEmpty())
+    CString strText;
+    if (!TipWindowSupport::TextToShow(this, m_pParentWnd, text, strText))
         return;
 
     CRect rectScreen = rect;

@@ -29,8 +29,7 @@ END_MESSAGE_MAP()
 BOOL KVXToolTipCtrl::Create(CWnd* pParentWnd)
 {
     m_pParentWnd = pParentWnd;
-    return CWnd::CreateEx(WS_EX_TOPMOST | WS_EX_TOOLWINDOW, kClassName, NULL, WS_POPUP | WS_BORDER,
-                          0, 0, 0, 0, NULL, NULL);
+    return TipWindowSupport::CreateTip(this, kClassName);
 }
 
 BOOL KVXToolTipCtrl::PreCreateWindow(CREATESTRUCT& cs)
@@ -44,12 +43,8 @@ BOOL KVXToolTipCtrl::PreCreateWindow(CREATESTRUCT& cs)
 
 void KVXToolTipCtrl::Show(CRect rect, CPoint point, const wchar_t* text, bool bShowAlways)
 {
-    if (m_hWnd == NULL || m_pParentWnd == NULL || IsWindowVisible())
-        return;
-    if (CWnd::GetFocus() == NULL)
-        return;   // tips only appear in the active application
-    const CString strText(text != NULL ? text : L"");
-    if (strText.IsEmpty())
+    CString strText;
+    if (!TipWindowSupport::TextToShow(this, m_pParentWnd, text, strText))
         return;
 
     CClientDC dc(this);

@@ -83,6 +83,22 @@ void ShowPlacement(CWnd* pTip, CDC& dc, const CString& strText, const TipLayout:
     }
 }
 
+BOOL CreateTip(CWnd* pTip, LPCTSTR lpszClassName)
+{
+    return pTip->CreateEx(WS_EX_TOPMOST | WS_EX_TOOLWINDOW, lpszClassName, NULL, WS_POPUP | WS_BORDER,
+                          0, 0, 0, 0, NULL, NULL);
+}
+
+bool TextToShow(CWnd* pTip, CWnd* pOwner, const wchar_t* text, CString& strText)
+{
+    if (pTip->m_hWnd == NULL || pOwner == NULL || pTip->IsWindowVisible())
+        return false;
+    if (CWnd::GetFocus() == NULL)
+        return false;   // tips only appear in the active application
+    strText = text != NULL ? text : L"";
+    return !strText.IsEmpty();
+}
+
 void Hide(CWnd* pTip)
 {
     ::ReleaseCapture();

@@ -17,6 +17,13 @@ HINSTANCE LibraryInstance();
 // Throws CResourceException when the registration fails.
 void RegisterTipClass(LPCTSTR lpszClassName);
 
+// Creates a tip window of the class: a topmost, bordered pop-up without owner.
+BOOL CreateTip(CWnd* pTip, LPCTSTR lpszClassName);
+
+// The text a tip may show now: false (nothing to show) for a tip without window or owner,
+// one already visible, while another application is active, or for a null or empty text.
+bool TextToShow(CWnd* pTip, CWnd* pOwner, const wchar_t* text, CString& strText);
+
 // Selects the owner's font (WM_GETFONT) into a DC for the lifetime of the object; an
 // owner without a font gets a temporary 8-point "MS Shell Dlg", deleted afterwards.
 class TipFont
