@@ -14,6 +14,7 @@
 #include "HeaderGeometry.h"
 #include "Input.h"
 #include "KVXHeaderCtrlEx.h"
+#include "ListsTestSupport.h"
 #include "Pixels.h"
 
 #include <memory>
@@ -54,8 +55,7 @@ TEST_P(SortArrowTest, Placement)
         testing::PrintToString(std::make_tuple(arrow.visible, arrow.x0, arrow.apexX, arrow.apexY, arrow.baseY)));
 }
 
-INSTANTIATE_TEST_SUITE_P(Cases, SortArrowTest, testing::ValuesIn(kArrowCases),
-    [](const testing::TestParamInfo<ArrowCase>& info) { return std::string(info.param.name); });
+INSTANTIATE_TEST_SUITE_P(Cases, SortArrowTest, testing::ValuesIn(kArrowCases), lists_test::CaseName<ArrowCase>);
 
 TEST(DropPositionTest, ItemUnderThePointerOrTheEnd)
 {
@@ -203,8 +203,7 @@ TEST_P(SortIndicatorPaintTest, Pixels)
     EXPECT_NE(sorted.At(arrow.apexX, arrow.apexY), unsorted.At(arrow.apexX, arrow.apexY));
 }
 
-INSTANTIATE_TEST_SUITE_P(Cases, SortIndicatorPaintTest, testing::ValuesIn(kPaintCases),
-    [](const testing::TestParamInfo<PaintCase>& info) { return std::string(info.param.name); });
+INSTANTIATE_TEST_SUITE_P(Cases, SortIndicatorPaintTest, testing::ValuesIn(kPaintCases), lists_test::CaseName<PaintCase>);
 
 // ---------------------------------------------------------------------------------
 // Column dragging. Steps: dN press on item N, mN move there with the button held,
@@ -251,7 +250,6 @@ TEST_P(ColumnDragTest, Callbacks)
     EXPECT_EQ(nullptr, ::GetCapture());
 }
 
-INSTANTIATE_TEST_SUITE_P(Cases, ColumnDragTest, testing::ValuesIn(kDragCases),
-    [](const testing::TestParamInfo<DragCase>& info) { return std::string(info.param.name); });
+INSTANTIATE_TEST_SUITE_P(Cases, ColumnDragTest, testing::ValuesIn(kDragCases), lists_test::CaseName<DragCase>);
 
 } // namespace

@@ -15,11 +15,12 @@
 
 #include "Input.h"
 #include "KVXListCtrlEx.h"
+#include "ListsTestSupport.h"
+#include "MsgSequence.h"
 
 #include <commctrl.h>
 
 #include <memory>
-#include <sstream>
 #include <string>
 
 namespace {
@@ -33,18 +34,6 @@ public:
     void PostSort() override { m_trace += ")"; }
     std::string m_trace;
 };
-
-// The header's sort message joins the trace as [column,ascending].
-LRESULT CALLBACK HeaderSpy(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam, UINT_PTR, DWORD_PTR data)
-{
-    if (message == WM_KVX_SETSORTEDCOLUMN)
-    {
-        std::ostringstream s;
-        s << "[" << static_cast<int>(wParam) << "," << lParam << "]";
-        *reinterpret_cast<std::string*>(data) += s.str();
-    }
-    return ::DefSubclassProc(hwnd, message, wParam, lParam);
-}
 
 // A parent that refuses every item change.
 LRESULT CALLBACK RefusingParent(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam, UINT_PTR, DWORD_PTR)
@@ -88,11 +77,17 @@ protected:
         ASSERT_TRUE(m_list.SetColumnTypes(kTypes, 5));
         ASSERT_TRUE(m_list.SetBaseTime(_T("6:00 AM")));
         ASSERT_FALSE(m_list.SetBaseTime(_T("soon")));
-        ::SetWindowSubclass(m_list.Header(), HeaderSpy, 1, reinterpret_cast<DWORD_PTR>(&m_list.m_trace));
+        // The header's sort message joins the trace as [column,ascending].
+        m_log.SpyWindow(m_list.Header(), 1);
+        m_log.onRecord = [this](int, const orvane_test::MsgEntry& e) {
+            if (e.message == WM_KVX_SETSORTEDCOLUMN)
+                m_list.m_trace += "[" + std::to_string(static_cast<int>(e.wParam)) + "," + std::to_string(e.lParam) + "]";
+        };
     }
 
     void TearDown() override
     {
+        m_log.Unspy(m_list.Header());
         m_list.DestroyWindow();
         m_host.reset();
     }
@@ -139,19 +134,16 @@ protected:
         for (int c = 0; c < m_list.GetHeaderCtrl()->GetItemCount(); ++c)
         {
             TCHAR title[16] = {};
-            LVCOLUMN column = {};
-            column.mask = LVCF_TEXT;
-            column.pszText = title;
-            column.cchTextMax = 16;
+            LVCOLUMN column = { LVCF_TEXT, 0, 0, title, 16 };
             m_list.GetColumn(c, &column);
-            const CString text = row < 0 ? CString(title) : m_list.GetItemText(row, c);
-            texts += (c > 0 ? "|" : "") + std::string(static_cast<LPCTSTR>(text), static_cast<LPCTSTR>(text) + text.GetLength());
+            texts += (c > 0 ? "|" : "") + lists_test::Narrow(row < 0 ? title : static_cast<LPCTSTR>(m_list.GetItemText(row, c)));
         }
         return texts;
     }
 
     std::unique_ptr<orvane_test::HostWindow> m_host;
     CTestList m_list;
+    orvane_test::MsgLog m_log;
 };
 
 TEST_F(ListFixture, HeaderTakenOverWhenCreatedOrSubclassed)
@@ -197,8 +189,7 @@ TEST_P(SortListTest, RowsAndItemData)
     EXPECT_EQ(std::to_string(c.column) + (c.ascending ? " asc" : " desc"), SortInfo());
 }
 
-INSTANTIATE_TEST_SUITE_P(Columns, SortListTest, testing::ValuesIn(kSortCases),
-    [](const testing::TestParamInfo<SortCase>& info) { return std::string(info.param.name); });
+INSTANTIATE_TEST_SUITE_P(Columns, SortListTest, testing::ValuesIn(kSortCases), lists_test::CaseName<SortCase>);
 
 TEST_F(ListFixture, SortStateAndHeaderTrace)
 {

@@ -10,6 +10,7 @@
 #include <gtest/gtest.h>
 
 #include "ListSortKeys.h"
+#include "ListsTestSupport.h"
 
 #include <vector>
 
@@ -66,7 +67,6 @@ TEST_P(SortOrderTest, RowsInOrder)
     EXPECT_EQ(c.expected, SortKeys(c.type, c.texts, baseTime).Order(c.ascending));
 }
 
-INSTANTIATE_TEST_SUITE_P(Rules, SortOrderTest, testing::ValuesIn(kOrderCases),
-    [](const testing::TestParamInfo<OrderCase>& info) { return std::string(info.param.name); });
+INSTANTIATE_TEST_SUITE_P(Rules, SortOrderTest, testing::ValuesIn(kOrderCases), lists_test::CaseName<OrderCase>);
 
 } // namespace
