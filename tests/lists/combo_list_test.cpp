@@ -1,11 +1,7 @@
-// The combo list in a modeless dialog: equipping, replacing and removing a row's combo box
-// (style, identifier, font, place, the count that does not match, the narrow column
-// widened, a box destroyed from outside); Page Down, arrows, scrolling and the wheel
-// showing, hiding and placing the boxes of the rows in view; a divider dragged left of
-// the combo column re-lays them, right of it not; a picked entry reported to the dialog,
-// Enter and Esc kept from the dialog, the null text after Esc; the title tip's text asked
-// from the parent; SelectItemsByState with LVIS_FOCUSED; a list destroyed with open
-// boxes many times leaves no window or heap block behind.
+// The combo list in a modeless dialog: a row's combo box equipped, replaced and removed;
+// keys, scrolling and the wheel placing the boxes of the rows in view; dividers up to the
+// combo column re-laying them; picked entries, Enter and Esc; the title tip's text from the
+// parent; SelectItemsByState with LVIS_FOCUSED; lists destroyed with open boxes, no leaks.
 #include <afxwin.h>
 #include <afxcmn.h>
 

@@ -1,11 +1,7 @@
-// The extended header:
-// - where the sort indicator goes (named geometry cases) and which insertion position
-//   a pointer marks while a column is dragged;
-// - the indicator as painted: ascending, descending, right-aligned, too narrow, none
-//   (-1 and out of range), read from the screen and compared with system colours;
-// - column dragging as message sequences: click without move, release on the item
-//   itself and on the next one, moves to the right, to the front and past the end,
-//   moves without the button, dragging disabled.
+// The extended header: the sort indicator's place and drop positions as tables; the indicator
+// as painted (ascending, descending, right-aligned, too narrow, none) against system colours;
+// column drags as step tables (click, release on own and next item, moves both ways, moves
+// without the button, dragging disabled).
 #include <afxwin.h>
 #include <afxcmn.h>
 

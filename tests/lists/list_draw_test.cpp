@@ -1,10 +1,7 @@
-// The extended list on screen under a framework parent: SetHighlightType; pixels per
-// highlight type with and without focus and LVS_SHOWSELALWAYS, the whole row repainted to
-// the client's edge, the focus rectangle; the invalid colour, state and small images clear
-// of the text, the ellipsis; the abbreviate callback's calls; no repaint for focus moving
-// into a child edit; hit tests on borders, the partly visible row, below the last row, at
-// the client's edge, outside report view; the fill width; check boxes; IterateItems; title
-// tips over cut-off cells; a painted list made and destroyed many times leaves nothing.
+// The extended list on screen under a framework parent: highlight pixels per type, focus and
+// LVS_SHOWSELALWAYS; the invalid colour, images, the ellipsis; the abbreviate callback; no
+// repaint for focus into a child edit; hit tests; the fill width; check boxes; IterateItems;
+// title tips over cut-off cells; painted lists made and destroyed many times, no leaks.
 #include <afxwin.h>
 #include <afxcmn.h>
 

@@ -1,13 +1,8 @@
-// The extended list control, sorting and column moves, with a parent on screen:
-// - the embedded header is taken over whether the list is created or subclassed;
-// - SortList by each column type, rows and their item data together, both directions;
-// - PreSort/PostSort and the header's message as one trace: the current column and
-//   direction skip the sort and the header, -1 clears, ResortList sorts again;
-// - header clicks sort and toggle, only with sorting enabled and the left button;
-// - SetColumnTypes with a code of 9, or too few codes: the text rule applies;
-// - a parent that refuses item changes leaves rows and data alone;
-// - drawing is suspended while sorting and left as the host had it;
-// - DragColumn moves a column with its texts, directly and from a header drag.
+// The extended list sorting, with a parent on screen: the header taken over (created or
+// subclassed); SortList per column type with item data following; PreSort/PostSort and the
+// header's message as one trace (same column skips, -1 clears, ResortList); header clicks;
+// SetColumnTypes with 9 or too few codes; refused item changes; drawing left as the host
+// had it; DragColumn directly and from a header drag.
 #include <afxwin.h>
 #include <afxcmn.h>
 

@@ -1,9 +1,6 @@
-// Sorting without a window, one named case per rule (texts in the test locale, en-US):
-// - case-sensitive and case-insensitive text, integers (_wtol prefixes, letters as 0,
-//   values far apart), floating point (2.5 before 10), dates and times, time of day
-//   after a base time, image indexes, the type that does not sort, an unknown type;
-// - equal keys keep their previous order for every type, in both directions;
-// - a text that is no date compares equal to every row and keeps its place.
+// Sorting without a window, one named case per rule and type (texts in the en-US test
+// locale): equal keys keep their previous order for every type in both directions; a text
+// that is no date compares equal and keeps its place; unknown and unsortable types.
 #include <afx.h>
 #include <afxdisp.h>
 
