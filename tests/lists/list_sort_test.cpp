@@ -17,6 +17,7 @@
 
 #include <memory>
 #include <string>
+#include <vector>
 
 namespace {
 
@@ -186,34 +187,31 @@ TEST_P(SortListTest, RowsAndItemData)
 
 INSTANTIATE_TEST_SUITE_P(Columns, SortListTest, testing::ValuesIn(kSortCases), lists_test::CaseName<SortCase>);
 
+// Steps: SortList(column, ascending), or ResortList for column -2; then the trace, the rows
+// and the sort state. Before the second step a row "d" sorting first by size is added.
+const struct { int column; bool ascending; const char* trace; const char* names; const char* info; } kSortSteps[] = {
+    { 1, true, "([1,1])", "abc", "1 asc" },
+    { 1, true, "()", "abcd", "1 asc" },        // the current column and direction: no sort, no header
+    { -2, true, "([1,1])", "dabc", "1 asc" },
+    { -1, false, "([-1,1])", "dabc", "none" },
+    { -2, true, "()", "dabc", "none" },
+};
+
 TEST_F(ListFixture, SortStateAndHeaderTrace)
 {
-    m_list.SortList(1, true);
-    EXPECT_EQ("([1,1])", m_list.m_trace);
-    EXPECT_EQ("abc", Names());
-
-    // The current column and direction: no sort, nothing for the header.
-    m_list.m_trace.clear();
-    m_list.InsertItem(LVIF_TEXT | LVIF_PARAM, 3, _T("d"), 0, 0, 0, 103);
-    m_list.SetItemText(3, 1, _T("1"));
-    m_list.SortList(1, true);
-    EXPECT_EQ("()", m_list.m_trace);
-    EXPECT_EQ("abcd", Names());
-
-    m_list.m_trace.clear();
-    m_list.ResortList();
-    EXPECT_EQ("([1,1])", m_list.m_trace);
-    EXPECT_EQ("dabc", Names());
-
-    m_list.m_trace.clear();
-    m_list.SortList(-1, false);
-    EXPECT_EQ("([-1,1])", m_list.m_trace);
-    EXPECT_EQ("none", SortInfo());
-    EXPECT_EQ("dabc", Names());
-
-    m_list.m_trace.clear();
-    m_list.ResortList();
-    EXPECT_EQ("()", m_list.m_trace);
+    for (const auto& step : kSortSteps)
+    {
+        if (&step == &kSortSteps[1])
+        {
+            m_list.InsertItem(LVIF_TEXT | LVIF_PARAM, 3, _T("d"), 0, 0, 0, 103);
+            m_list.SetItemText(3, 1, _T("1"));
+        }
+        m_list.m_trace.clear();
+        step.column == -2 ? m_list.ResortList() : m_list.SortList(step.column, step.ascending);
+        EXPECT_EQ(testing::PrintToString(std::vector<std::string>{ step.trace, step.names, step.info }),
+                  testing::PrintToString(std::vector<std::string>{ m_list.m_trace, Names(), SortInfo() }))
+            << "step " << &step - kSortSteps;
+    }
 }
 
 TEST_F(ListFixture, HeaderClicksSortWhenEnabled)
