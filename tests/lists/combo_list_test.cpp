@@ -1,11 +1,7 @@
-// The combo list in a modeless dialog: equipping, replacing and removing a row's combo box
-// (style, identifier, font, place, the count that does not match, the narrow column
-// widened, a box destroyed from outside); Page Down, arrows, scrolling and the wheel
-// showing, hiding and placing the boxes of the rows in view; a divider dragged left of
-// the combo column re-lays them, right of it not; a picked entry reported to the dialog,
-// Enter and Esc kept from the dialog, the null text after Esc; the title tip's text asked
-// from the parent; SelectItemsByState with LVIS_FOCUSED; a list destroyed with open
-// boxes many times leaves no window or heap block behind.
+// The combo list in a modeless dialog: a row's combo box equipped, replaced and removed;
+// keys, scrolling and the wheel placing the boxes of the rows in view; dividers up to the
+// combo column re-laying them; picked entries, Enter and Esc; the title tip's text from the
+// parent; SelectItemsByState with LVIS_FOCUSED; lists destroyed with open boxes, no leaks.
 #include <afxwin.h>
 #include <afxcmn.h>
 
@@ -15,6 +11,7 @@
 #include "Input.h"
 #include "KVXComboBoxListCtrlEx.h"
 #include "KVXSimpleListControlExItemCommand.h"
+#include "ListsTestSupport.h"
 #include "MsgSequence.h"
 
 #include <string>
@@ -23,6 +20,7 @@
 namespace {
 
 using namespace orvane_test;
+using lists_test::Narrow;
 
 const UINT kListId = 7;
 const int kComboBase = 5106;
@@ -36,8 +34,6 @@ class CTestList : public KVXComboBoxListCtrlEx
 public:
     KVXTitleTipCtrl& Tip() { return m_ctlTitleTip; }
 };
-
-std::string Narrow(LPCWSTR s) { return s == nullptr ? "(null)" : std::string(s, s + wcslen(s)); }
 
 class ComboListTest : public testing::Test
 {
@@ -324,24 +320,6 @@ TEST_F(ComboListTest, SelectItemsByStateWithTheFocusedRow)
     EXPECT_EQ("", SelectedRows(m_list));
 }
 
-// Windows of this thread (children included) and busy heap blocks.
-std::vector<long> Resources()
-{
-    static long windows;
-    windows = 0;
-    ::EnumThreadWindows(::GetCurrentThreadId(), [](HWND hwnd, LPARAM) -> BOOL {
-        ::EnumChildWindows(hwnd, [](HWND, LPARAM) -> BOOL { return ++windows > 0; }, 0);
-        return ++windows > 0;
-    }, 0);
-    long blocks = 0;
-    HANDLE heaps[64];
-    const DWORD count = ::GetProcessHeaps(64, heaps);
-    for (DWORD h = 0; h < count && h < 64; ++h)
-        for (PROCESS_HEAP_ENTRY entry = {}; ::HeapWalk(heaps[h], &entry);)
-            blocks += (entry.wFlags & PROCESS_HEAP_ENTRY_BUSY) != 0;
-    return { windows, blocks };
-}
-
 TEST_F(ComboListTest, ListsDestroyedWithOpenBoxesLeaveNothing)
 {
     auto cycles = [&](int count) {
@@ -365,16 +343,8 @@ TEST_F(ComboListTest, ListsDestroyedWithOpenBoxesLeaveNothing)
             PumpUntilIdle(20);
         }
     };
-    cycles(3);
-    const std::vector<long> before = Resources();
-    cycles(10);
-    const std::vector<long> half = Resources();
-    cycles(10);
-    const std::vector<long> after = Resources();
-    EXPECT_EQ(before[0], after[0]) << "windows";
-    // A box left behind would leave several blocks per cycle; the harness's own come and go.
-    EXPECT_FALSE(half[1] >= before[1] + 10 && after[1] >= half[1] + 10)
-        << "heap blocks " << before[1] << " " << half[1] << " " << after[1];
+    // A box left behind would leave several heap blocks per cycle.
+    lists_test::ExpectNoLeaks(cycles, 3, 10, 10);
 }
 
 } // namespace

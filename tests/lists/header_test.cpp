@@ -1,11 +1,7 @@
-// The extended header:
-// - where the sort indicator goes (named geometry cases) and which insertion position
-//   a pointer marks while a column is dragged;
-// - the indicator as painted: ascending, descending, right-aligned, too narrow, none
-//   (-1 and out of range), read from the screen and compared with system colours;
-// - column dragging as message sequences: click without move, release on the item
-//   itself and on the next one, moves to the right, to the front and past the end,
-//   moves without the button, dragging disabled.
+// The extended header: the sort indicator's place and drop positions as tables; the indicator
+// as painted (ascending, descending, right-aligned, too narrow, none) against system colours;
+// column drags as step tables (click, release on own and next item, moves both ways, moves
+// without the button, dragging disabled).
 #include <afxwin.h>
 #include <afxcmn.h>
 
@@ -14,6 +10,7 @@
 #include "HeaderGeometry.h"
 #include "Input.h"
 #include "KVXHeaderCtrlEx.h"
+#include "ListsTestSupport.h"
 #include "Pixels.h"
 
 #include <memory>
@@ -54,8 +51,7 @@ TEST_P(SortArrowTest, Placement)
         testing::PrintToString(std::make_tuple(arrow.visible, arrow.x0, arrow.apexX, arrow.apexY, arrow.baseY)));
 }
 
-INSTANTIATE_TEST_SUITE_P(Cases, SortArrowTest, testing::ValuesIn(kArrowCases),
-    [](const testing::TestParamInfo<ArrowCase>& info) { return std::string(info.param.name); });
+INSTANTIATE_TEST_SUITE_P(Cases, SortArrowTest, testing::ValuesIn(kArrowCases), lists_test::CaseName<ArrowCase>);
 
 TEST(DropPositionTest, ItemUnderThePointerOrTheEnd)
 {
@@ -203,8 +199,7 @@ TEST_P(SortIndicatorPaintTest, Pixels)
     EXPECT_NE(sorted.At(arrow.apexX, arrow.apexY), unsorted.At(arrow.apexX, arrow.apexY));
 }
 
-INSTANTIATE_TEST_SUITE_P(Cases, SortIndicatorPaintTest, testing::ValuesIn(kPaintCases),
-    [](const testing::TestParamInfo<PaintCase>& info) { return std::string(info.param.name); });
+INSTANTIATE_TEST_SUITE_P(Cases, SortIndicatorPaintTest, testing::ValuesIn(kPaintCases), lists_test::CaseName<PaintCase>);
 
 // ---------------------------------------------------------------------------------
 // Column dragging. Steps: dN press on item N, mN move there with the button held,
@@ -251,7 +246,6 @@ TEST_P(ColumnDragTest, Callbacks)
     EXPECT_EQ(nullptr, ::GetCapture());
 }
 
-INSTANTIATE_TEST_SUITE_P(Cases, ColumnDragTest, testing::ValuesIn(kDragCases),
-    [](const testing::TestParamInfo<DragCase>& info) { return std::string(info.param.name); });
+INSTANTIATE_TEST_SUITE_P(Cases, ColumnDragTest, testing::ValuesIn(kDragCases), lists_test::CaseName<DragCase>);
 
 } // namespace

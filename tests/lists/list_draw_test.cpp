@@ -1,10 +1,7 @@
-// The extended list on screen under a framework parent: SetHighlightType; pixels per
-// highlight type with and without focus and LVS_SHOWSELALWAYS, the whole row repainted to
-// the client's edge, the focus rectangle; the invalid colour, state and small images clear
-// of the text, the ellipsis; the abbreviate callback's calls; no repaint for focus moving
-// into a child edit; hit tests on borders, the partly visible row, below the last row, at
-// the client's edge, outside report view; the fill width; check boxes; IterateItems; title
-// tips over cut-off cells; a painted list made and destroyed many times leaves nothing.
+// The extended list on screen under a framework parent: highlight pixels per type, focus and
+// LVS_SHOWSELALWAYS; the invalid colour, images, the ellipsis; the abbreviate callback; no
+// repaint for focus into a child edit; hit tests; the fill width; check boxes; IterateItems;
+// title tips over cut-off cells; painted lists made and destroyed many times, no leaks.
 #include <afxwin.h>
 #include <afxcmn.h>
 
@@ -12,20 +9,17 @@
 
 #include "Input.h"
 #include "KVXListCtrlEx.h"
-#include "ListGeometry.h"
+#include "ListsTestSupport.h"
 #include "Pixels.h"
 
-#include <memory>
 #include <string>
 #include <tuple>
-#include <utility>
 #include <vector>
 
 namespace {
 
 using namespace orvane_test;
-
-std::string Narrow(const CString& s) { return std::string(static_cast<LPCTSTR>(s), static_cast<LPCTSTR>(s) + s.GetLength()); }
+using lists_test::Narrow;
 
 // The list's parent: a framework window, so that WM_DRAWITEM is reflected to the list, and
 // the target of the abbreviate callback.
@@ -259,7 +253,7 @@ TEST_F(ListDrawTest, AbbreviateCallbackGetsEveryNonEmptyText)
 {
     m_list.SetAbbreviateName(static_cast<CString (CWnd::*)(CString, int, int)>(&CParent::Abbreviate));
     const ClientCapture capture(m_list);
-    const std::string longText = Narrow(CString(kLongText));
+    const std::string longText = Narrow(kLongText);
     const std::vector<std::string> expected = { "Alpha 40 1", "One 40 1", "Beta 40 1", "Two 40 1", "Three 40 1",
         longText + " 40 1", longText + " 40 1", "~hidden 40 1" };
     EXPECT_EQ(expected, m_parent.m_calls);
@@ -449,24 +443,7 @@ TEST_F(ListDrawTest, PaintedListsLeaveNothingBehind)
             PumpUntilIdle(20);
         }
     };
-    // Live GDI objects (every 16-bit handle index the system resolves) and top-level windows.
-    auto count = [] {
-        std::pair<int, int> n(0, 0);
-        for (UINT_PTR i = 1; i <= 0xFFFF; ++i)
-            n.first += ::GetObjectType(reinterpret_cast<HGDIOBJ>(i)) != 0;
-        ::EnumThreadWindows(::GetCurrentThreadId(), [](HWND, LPARAM p) -> BOOL { return ++*reinterpret_cast<int*>(p); },
-                            reinterpret_cast<LPARAM>(&n.second));
-        return n;
-    };
-    cycles(5);
-    const auto before = count();
-    cycles(25);
-    const auto half = count();
-    cycles(25);
-    const auto after = count();
-    EXPECT_FALSE(half.first > before.first && after.first > half.first)
-        << "GDI objects " << before.first << " " << half.first << " " << after.first;
-    EXPECT_EQ(before.second, after.second) << "windows";
+    lists_test::ExpectNoLeaks(cycles, 5, 25, 0);
 }
 
 } // namespace

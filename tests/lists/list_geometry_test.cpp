@@ -5,6 +5,7 @@
 #include <gtest/gtest.h>
 
 #include "ListGeometry.h"
+#include "ListsTestSupport.h"
 
 #include <commctrl.h>
 
@@ -15,10 +16,8 @@ using namespace ListGeometry;
 
 namespace {
 
-std::string Str(const RECT& r) { return testing::PrintToString(std::vector<LONG>{ r.left, r.top, r.right, r.bottom }); }
-
-template <typename Case>
-std::string CaseName(const testing::TestParamInfo<Case>& info) { return info.param.name; }
+using lists_test::CaseName;
+using lists_test::Str;
 
 // Row from 0 to boundsRight, label (34, 20, 100, 37), offset 6, client right 400.
 struct HighlightCase { const char* name; int type; int boundsRight; int textWidth; RECT expected; };

@@ -1,13 +1,8 @@
-// The extended list control, sorting and column moves, with a parent on screen:
-// - the embedded header is taken over whether the list is created or subclassed;
-// - SortList by each column type, rows and their item data together, both directions;
-// - PreSort/PostSort and the header's message as one trace: the current column and
-//   direction skip the sort and the header, -1 clears, ResortList sorts again;
-// - header clicks sort and toggle, only with sorting enabled and the left button;
-// - SetColumnTypes with a code of 9, or too few codes: the text rule applies;
-// - a parent that refuses item changes leaves rows and data alone;
-// - drawing is suspended while sorting and left as the host had it;
-// - DragColumn moves a column with its texts, directly and from a header drag.
+// The extended list sorting, with a parent on screen: the header taken over (created or
+// subclassed); SortList per column type with item data following; PreSort/PostSort and the
+// header's message as one trace (same column skips, -1 clears, ResortList); header clicks;
+// SetColumnTypes with 9 or too few codes; refused item changes; drawing left as the host
+// had it; DragColumn directly and from a header drag.
 #include <afxwin.h>
 #include <afxcmn.h>
 
@@ -15,12 +10,14 @@
 
 #include "Input.h"
 #include "KVXListCtrlEx.h"
+#include "ListsTestSupport.h"
+#include "MsgSequence.h"
 
 #include <commctrl.h>
 
 #include <memory>
-#include <sstream>
 #include <string>
+#include <vector>
 
 namespace {
 
@@ -33,18 +30,6 @@ public:
     void PostSort() override { m_trace += ")"; }
     std::string m_trace;
 };
-
-// The header's sort message joins the trace as [column,ascending].
-LRESULT CALLBACK HeaderSpy(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam, UINT_PTR, DWORD_PTR data)
-{
-    if (message == WM_KVX_SETSORTEDCOLUMN)
-    {
-        std::ostringstream s;
-        s << "[" << static_cast<int>(wParam) << "," << lParam << "]";
-        *reinterpret_cast<std::string*>(data) += s.str();
-    }
-    return ::DefSubclassProc(hwnd, message, wParam, lParam);
-}
 
 // A parent that refuses every item change.
 LRESULT CALLBACK RefusingParent(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam, UINT_PTR, DWORD_PTR)
@@ -88,11 +73,17 @@ protected:
         ASSERT_TRUE(m_list.SetColumnTypes(kTypes, 5));
         ASSERT_TRUE(m_list.SetBaseTime(_T("6:00 AM")));
         ASSERT_FALSE(m_list.SetBaseTime(_T("soon")));
-        ::SetWindowSubclass(m_list.Header(), HeaderSpy, 1, reinterpret_cast<DWORD_PTR>(&m_list.m_trace));
+        // The header's sort message joins the trace as [column,ascending].
+        m_log.SpyWindow(m_list.Header(), 1);
+        m_log.onRecord = [this](int, const orvane_test::MsgEntry& e) {
+            if (e.message == WM_KVX_SETSORTEDCOLUMN)
+                m_list.m_trace += "[" + std::to_string(static_cast<int>(e.wParam)) + "," + std::to_string(e.lParam) + "]";
+        };
     }
 
     void TearDown() override
     {
+        m_log.Unspy(m_list.Header());
         m_list.DestroyWindow();
         m_host.reset();
     }
@@ -139,19 +130,16 @@ protected:
         for (int c = 0; c < m_list.GetHeaderCtrl()->GetItemCount(); ++c)
         {
             TCHAR title[16] = {};
-            LVCOLUMN column = {};
-            column.mask = LVCF_TEXT;
-            column.pszText = title;
-            column.cchTextMax = 16;
+            LVCOLUMN column = { LVCF_TEXT, 0, 0, title, 16 };
             m_list.GetColumn(c, &column);
-            const CString text = row < 0 ? CString(title) : m_list.GetItemText(row, c);
-            texts += (c > 0 ? "|" : "") + std::string(static_cast<LPCTSTR>(text), static_cast<LPCTSTR>(text) + text.GetLength());
+            texts += (c > 0 ? "|" : "") + lists_test::Narrow(row < 0 ? title : static_cast<LPCTSTR>(m_list.GetItemText(row, c)));
         }
         return texts;
     }
 
     std::unique_ptr<orvane_test::HostWindow> m_host;
     CTestList m_list;
+    orvane_test::MsgLog m_log;
 };
 
 TEST_F(ListFixture, HeaderTakenOverWhenCreatedOrSubclassed)
@@ -197,37 +185,33 @@ TEST_P(SortListTest, RowsAndItemData)
     EXPECT_EQ(std::to_string(c.column) + (c.ascending ? " asc" : " desc"), SortInfo());
 }
 
-INSTANTIATE_TEST_SUITE_P(Columns, SortListTest, testing::ValuesIn(kSortCases),
-    [](const testing::TestParamInfo<SortCase>& info) { return std::string(info.param.name); });
+INSTANTIATE_TEST_SUITE_P(Columns, SortListTest, testing::ValuesIn(kSortCases), lists_test::CaseName<SortCase>);
+
+// Steps: SortList(column, ascending), or ResortList for column -2; then the trace, the rows
+// and the sort state. Before the second step a row "d" sorting first by size is added.
+const struct { int column; bool ascending; const char* trace; const char* names; const char* info; } kSortSteps[] = {
+    { 1, true, "([1,1])", "abc", "1 asc" },
+    { 1, true, "()", "abcd", "1 asc" },        // the current column and direction: no sort, no header
+    { -2, true, "([1,1])", "dabc", "1 asc" },
+    { -1, false, "([-1,1])", "dabc", "none" },
+    { -2, true, "()", "dabc", "none" },
+};
 
 TEST_F(ListFixture, SortStateAndHeaderTrace)
 {
-    m_list.SortList(1, true);
-    EXPECT_EQ("([1,1])", m_list.m_trace);
-    EXPECT_EQ("abc", Names());
-
-    // The current column and direction: no sort, nothing for the header.
-    m_list.m_trace.clear();
-    m_list.InsertItem(LVIF_TEXT | LVIF_PARAM, 3, _T("d"), 0, 0, 0, 103);
-    m_list.SetItemText(3, 1, _T("1"));
-    m_list.SortList(1, true);
-    EXPECT_EQ("()", m_list.m_trace);
-    EXPECT_EQ("abcd", Names());
-
-    m_list.m_trace.clear();
-    m_list.ResortList();
-    EXPECT_EQ("([1,1])", m_list.m_trace);
-    EXPECT_EQ("dabc", Names());
-
-    m_list.m_trace.clear();
-    m_list.SortList(-1, false);
-    EXPECT_EQ("([-1,1])", m_list.m_trace);
-    EXPECT_EQ("none", SortInfo());
-    EXPECT_EQ("dabc", Names());
-
-    m_list.m_trace.clear();
-    m_list.ResortList();
-    EXPECT_EQ("()", m_list.m_trace);
+    for (const auto& step : kSortSteps)
+    {
+        if (&step == &kSortSteps[1])
+        {
+            m_list.InsertItem(LVIF_TEXT | LVIF_PARAM, 3, _T("d"), 0, 0, 0, 103);
+            m_list.SetItemText(3, 1, _T("1"));
+        }
+        m_list.m_trace.clear();
+        step.column == -2 ? m_list.ResortList() : m_list.SortList(step.column, step.ascending);
+        EXPECT_EQ(testing::PrintToString(std::vector<std::string>{ step.trace, step.names, step.info }),
+                  testing::PrintToString(std::vector<std::string>{ m_list.m_trace, Names(), SortInfo() }))
+            << "step " << &step - kSortSteps;
+    }
 }
 
 TEST_F(ListFixture, HeaderClicksSortWhenEnabled)

@@ -1,15 +1,13 @@
-// Sorting without a window, one named case per rule (texts in the test locale, en-US):
-// - case-sensitive and case-insensitive text, integers (_wtol prefixes, letters as 0,
-//   values far apart), floating point (2.5 before 10), dates and times, time of day
-//   after a base time, image indexes, the type that does not sort, an unknown type;
-// - equal keys keep their previous order for every type, in both directions;
-// - a text that is no date compares equal to every row and keeps its place.
+// Sorting without a window, one named case per rule and type (texts in the en-US test
+// locale): equal keys keep their previous order for every type in both directions; a text
+// that is no date compares equal and keeps its place; unknown and unsortable types.
 #include <afx.h>
 #include <afxdisp.h>
 
 #include <gtest/gtest.h>
 
 #include "ListSortKeys.h"
+#include "ListsTestSupport.h"
 
 #include <vector>
 
@@ -66,7 +64,6 @@ TEST_P(SortOrderTest, RowsInOrder)
     EXPECT_EQ(c.expected, SortKeys(c.type, c.texts, baseTime).Order(c.ascending));
 }
 
-INSTANTIATE_TEST_SUITE_P(Rules, SortOrderTest, testing::ValuesIn(kOrderCases),
-    [](const testing::TestParamInfo<OrderCase>& info) { return std::string(info.param.name); });
+INSTANTIATE_TEST_SUITE_P(Rules, SortOrderTest, testing::ValuesIn(kOrderCases), lists_test::CaseName<OrderCase>);
 
 } // namespace
