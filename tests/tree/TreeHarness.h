@@ -1,6 +1,7 @@
-// Test harness of the tree family: a parent window that records the notifications it
-// receives (with IsEmulatedNotify at that moment) as a compact trace, a tree that exposes
-// the protected operations, and a fixture that builds named items and drives presses.
+// Test harness of the tree family: a parent window that vetoes and answers probes, the
+// notifications it receives recorded by a MsgLog (with IsEmulatedNotify at that moment) as
+// a compact trace, a tree that exposes the protected operations, and a fixture that builds
+// named items and drives presses.
 //
 // Trace of one notification: [*]code[:-old][+new]
 //   *    sent by the control itself (IsEmulatedNotify was TRUE during the call)
@@ -15,6 +16,7 @@
 
 #include "CMultiTree.h"
 #include "Input.h"
+#include "MsgSequence.h"
 #include "OrvaneLibrary.h"
 
 #include <map>
@@ -59,91 +61,28 @@ public:
     }
 };
 
-class CRecordingParent : public CWnd
+// Refuses TVN_SELCHANGINGW naming m_hVeto. A posted kProbeMessage records the selection
+// when a press loop dispatches it: the state between the press and the release. A posted
+// kCaptureMessage gives the mouse capture to the window in wParam.
+class CTestParent : public CWnd
 {
 public:
-    struct Record
-    {
-        UINT code;
-        bool emulated;
-        std::string oldName, newName;
-        UINT newMask;
-        LPARAM newParam;
-        POINT ptDrag;
-    };
-
-    std::string Trace() const
-    {
-        std::string trace;
-        for (const Record& r : m_records)
-        {
-            trace += (trace.empty() ? "" : " ") + std::string(r.emulated ? "*" : "") + CodeName(r.code);
-            if (!r.oldName.empty() || !r.newName.empty())
-                trace += ":" + (r.oldName.empty() ? "" : "-" + r.oldName) + (r.newName.empty() ? "" : "+" + r.newName);
-        }
-        return trace;
-    }
-    void ClearTrace() { m_records.clear(); }
-    const Record* Last(UINT code) const
-    {
-        for (auto it = m_records.rbegin(); it != m_records.rend(); ++it)
-            if (it->code == code)
-                return &*it;
-        return nullptr;
-    }
-
-    CTestTree* m_pTree = nullptr;
-    HTREEITEM m_hVeto = NULL;                       // TVN_SELCHANGINGW naming this item is refused
-    std::vector<std::string> m_selectionAtClick;    // the selection at each NM_CLICK
-    // A posted kProbeMessage records the selection when a press loop dispatches it: the
-    // state between the press and the release. A posted kCaptureMessage gives the mouse
-    // capture to the window in wParam.
     static constexpr UINT kProbeMessage = WM_APP + 7;
     static constexpr UINT kCaptureMessage = WM_APP + 8;
+    CTestTree* m_pTree = nullptr;
+    HTREEITEM m_hVeto = NULL;
     std::vector<std::string> m_probes;
     void PostProbe() { PostMessage(kProbeMessage); }
 
 protected:
-    static const char* CodeName(UINT code)
-    {
-        switch (code)
-        {
-        case TVN_SELCHANGINGW: return "ing";
-        case TVN_SELCHANGEDW: return "ed";
-        case NM_CLICK: return "click";
-        case NM_RCLICK: return "rclick";
-        case TVN_BEGINDRAGW: return "drag";
-        case TVN_BEGINRDRAGW: return "rdrag";
-        case TVN_ITEMEXPANDINGW: return "expanding";
-        case TVN_ITEMEXPANDEDW: return "expanded";
-        default: return nullptr;
-        }
-    }
     BOOL OnNotify(WPARAM wParam, LPARAM lParam, LRESULT* pResult) override
     {
-        const NMHDR* pHdr = reinterpret_cast<const NMHDR*>(lParam);
-        if (m_pTree != nullptr && pHdr->hwndFrom == m_pTree->m_hWnd && CodeName(pHdr->code) != nullptr)
+        const NMTREEVIEW* pNM = reinterpret_cast<const NMTREEVIEW*>(lParam);
+        if (pNM->hdr.code == TVN_SELCHANGINGW && m_hVeto != NULL
+            && (pNM->itemNew.hItem == m_hVeto || pNM->itemOld.hItem == m_hVeto))
         {
-            Record r = { pHdr->code, m_pTree->IsEmulatedNotify() != FALSE };
-            if (pHdr->code != NM_CLICK && pHdr->code != NM_RCLICK)
-            {
-                const NMTREEVIEW* pNM = reinterpret_cast<const NMTREEVIEW*>(lParam);
-                r.oldName = ItemName(*m_pTree, pNM->itemOld.hItem);
-                r.newName = ItemName(*m_pTree, pNM->itemNew.hItem);
-                r.newMask = pNM->itemNew.mask;
-                r.newParam = pNM->itemNew.lParam;
-                r.ptDrag = pNM->ptDrag;
-                if (pHdr->code == TVN_SELCHANGINGW && m_hVeto != NULL
-                    && (pNM->itemNew.hItem == m_hVeto || pNM->itemOld.hItem == m_hVeto))
-                {
-                    m_records.push_back(r);
-                    *pResult = TRUE;
-                    return TRUE;
-                }
-            }
-            else
-                m_selectionAtClick.push_back(SelectedNames(*m_pTree));
-            m_records.push_back(r);
+            *pResult = TRUE;
+            return TRUE;
         }
         // The framework reflects the notification to the tree first (collapse handling).
         return CWnd::OnNotify(wParam, lParam, pResult);
@@ -158,9 +97,6 @@ protected:
             return CWnd::WindowProc(message, wParam, lParam);
         return 0;
     }
-
-private:
-    std::vector<Record> m_records;
 };
 
 // Bounds a press: the press loops end when the control loses the capture, so a loop still
@@ -199,6 +135,7 @@ protected:
     static void SetUpTestSuite() { orvane_test::LoadLibraryOnce(); }
     void SetUp() override
     {
+        m_log.onRecord = [this](int, const orvane_test::MsgEntry& e) { Record(e); };
         ASSERT_TRUE(CreateParent());
         m_parent.m_pTree = &m_tree;
         CreateTree();
@@ -206,8 +143,54 @@ protected:
     // The tree's top-level parent window (again, after a test destroyed it).
     bool CreateParent()
     {
-        return m_parent.CreateEx(0, AfxRegisterWndClass(0, ::LoadCursor(NULL, IDC_ARROW), HBRUSH(COLOR_WINDOW + 1)),
-                                 _T("tree test"), WS_POPUP | WS_VISIBLE | WS_CLIPCHILDREN, 60, 60, 320, 420, NULL, NULL) != FALSE;
+        if (!m_parent.CreateEx(0, AfxRegisterWndClass(0, ::LoadCursor(NULL, IDC_ARROW), HBRUSH(COLOR_WINDOW + 1)),
+                               _T("tree test"), WS_POPUP | WS_VISIBLE | WS_CLIPCHILDREN, 60, 60, 320, 420, NULL, NULL))
+            return false;
+        m_log.SpyParent(m_parent, 0);
+        return true;
+    }
+    // Appends a notification of the tree to the trace while it is being sent.
+    void Record(const orvane_test::MsgEntry& e)
+    {
+        const NMTREEVIEW* pNM = reinterpret_cast<const NMTREEVIEW*>(e.lParam);
+        const char* code = e.message == WM_NOTIFY && pNM->hdr.hwndFrom == m_tree.m_hWnd ? CodeName(pNM->hdr.code) : nullptr;
+        m_log.Flush();
+        if (code == nullptr)
+            return;
+        std::string entry = (m_tree.IsEmulatedNotify() ? "*" : "") + std::string(code);
+        if (pNM->hdr.code == NM_CLICK || pNM->hdr.code == NM_RCLICK)
+            m_selectionAtClick.push_back(Selected());
+        else
+        {
+            const std::string oldName = ItemName(m_tree, pNM->itemOld.hItem), newName = ItemName(m_tree, pNM->itemNew.hItem);
+            if (!oldName.empty() || !newName.empty())
+                entry += ":" + (oldName.empty() ? "" : "-" + oldName) + (newName.empty() ? "" : "+" + newName);
+        }
+        m_trace += (m_trace.empty() ? "" : " ") + entry;
+    }
+    static const char* CodeName(UINT code)
+    {
+        switch (code)
+        {
+        case TVN_SELCHANGINGW: return "ing";
+        case TVN_SELCHANGEDW: return "ed";
+        case NM_CLICK: return "click";
+        case NM_RCLICK: return "rclick";
+        case TVN_BEGINDRAGW: return "drag";
+        case TVN_BEGINRDRAGW: return "rdrag";
+        case TVN_ITEMEXPANDINGW: return "expanding";
+        case TVN_ITEMEXPANDEDW: return "expanded";
+        default: return nullptr;
+        }
+    }
+    // Whether the trace holds a notification of this code ("click", "drag"...).
+    bool Traced(const std::string& code) const
+    {
+        std::istringstream words(m_trace);
+        for (std::string w; words >> w;)
+            if (w.substr(w[0] == '*' ? 1 : 0, w.find(':') - (w[0] == '*' ? 1 : 0)) == code)
+                return true;
+        return false;
     }
     void TearDown() override
     {
@@ -249,7 +232,7 @@ protected:
                 m_tree.Expand(entry.second, TVE_EXPAND);
         m_tree.SetRedraw(TRUE);
         m_tree.UpdateWindow();
-        m_parent.ClearTrace();
+        m_trace.clear();
     }
     // count flat items "I0".."I<count-1>".
     void BuildFlat(int count)
@@ -280,8 +263,8 @@ protected:
         }
         m_tree.SetAnchor(NULL);
         m_tree.UpdateWindow();
-        m_parent.ClearTrace();
-        m_parent.m_selectionAtClick.clear();
+        m_trace.clear();
+        m_selectionAtClick.clear();
         m_parent.m_probes.clear();
         m_tree.m_hookTrace.clear();
     }
@@ -338,9 +321,12 @@ protected:
         orvane_test::PumpUntilIdle(50);
     }
 
-    CRecordingParent m_parent;
+    CTestParent m_parent;
     CTestTree m_tree;
     std::map<std::string, HTREEITEM> m_items;
+    orvane_test::MsgLog m_log{ 1 };
+    std::string m_trace;
+    std::vector<std::string> m_selectionAtClick;   // the selection at each NM_CLICK
 };
 
 } // namespace tree_test
