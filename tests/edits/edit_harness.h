@@ -208,7 +208,7 @@ inline RECT RectInParent(HWND hwnd)
 }
 
 // A page with the library loaded; edits are created with Create at a rectangle of it.
-class NumericFixture : public testing::Test
+class PageFixture : public testing::Test
 {
 protected:
     static void SetUpTestSuite() { orvane_test::LoadLibraryOnce(); }

@@ -43,12 +43,12 @@ std::vector<std::string> Concat(std::initializer_list<std::vector<std::string>> 
 }
 
 // An integer edit at (10, 20, 110, 41) showing 100, with its spin.
-class Spin : public NumericFixture
+class Spin : public PageFixture
 {
 protected:
     void SetUp() override
     {
-        NumericFixture::SetUp();
+        PageFixture::SetUp();
         CreateIn(edit, CRect(10, 20, 110, 41), 100);
         hSpin = edit.SpinHwnd();
         ASSERT_TRUE(::IsWindow(hSpin));
@@ -64,7 +64,7 @@ protected:
     {
         if (::IsWindow(hSpin))
             ::SendMessageW(hSpin, WM_LBUTTONUP, 0, 0);
-        NumericFixture::TearDown();
+        PageFixture::TearDown();
     }
 
     void Clear()

@@ -153,7 +153,8 @@ protected:
     void Record(const orvane_test::MsgEntry& e)
     {
         const NMTREEVIEW* pNM = reinterpret_cast<const NMTREEVIEW*>(e.lParam);
-        const char* code = e.message == WM_NOTIFY && pNM->hdr.hwndFrom == m_tree.m_hWnd ? CodeName(pNM->hdr.code) : nullptr;
+        const bool fromTree = e.message == WM_NOTIFY && pNM->hdr.hwndFrom == m_tree.m_hWnd;
+        const char* code = fromTree ? CodeName(pNM->hdr.code) : nullptr;
         m_log.Flush();
         if (code == nullptr)
             return;
@@ -162,7 +163,8 @@ protected:
             m_selectionAtClick.push_back(Selected());
         else
         {
-            const std::string oldName = ItemName(m_tree, pNM->itemOld.hItem), newName = ItemName(m_tree, pNM->itemNew.hItem);
+            const std::string oldName = ItemName(m_tree, pNM->itemOld.hItem);
+            const std::string newName = ItemName(m_tree, pNM->itemNew.hItem);
             if (!oldName.empty() || !newName.empty())
                 entry += ":" + (oldName.empty() ? "" : "-" + oldName) + (newName.empty() ? "" : "+" + newName);
         }
