@@ -12,10 +12,6 @@
 // - the highlight of every selected label, not only the caret's, follows the focus.
 #include "TreeHarness.h"
 
-#include "Input.h"
-
-#include <sstream>
-
 using namespace tree_test;
 
 namespace {
@@ -233,29 +229,20 @@ TEST_F(MouseTest, RightButtonSelectsWithoutTouchingTheAnchorAndSendsRClickOrRDra
     Arrange("A B", "A");
     m_tree.SetAnchor(Item("A"));
     PostButtonUp(LabelPoint("D"), 0, WM_RBUTTONUP);
-    {
-        PressWatchdog watchdog;
-        m_tree.OnButtonDown(FALSE, MK_RBUTTON, LabelPoint("D"));
-    }
+    RightPress(LabelPoint("D"));
     EXPECT_EQ("D", Selected());
     EXPECT_EQ("D", Caret());
     EXPECT_EQ(Item("A"), m_tree.Anchor());
     EXPECT_EQ("*rclick", LastCode());
     PostButtonUp(LabelPoint("B"), 0, WM_RBUTTONUP);
-    {
-        PressWatchdog watchdog;
-        m_tree.OnButtonDown(FALSE, MK_RBUTTON | MK_CONTROL, LabelPoint("B"));
-    }
+    RightPress(LabelPoint("B"), MK_RBUTTON | MK_CONTROL);
     EXPECT_EQ(Item("B"), m_tree.Anchor());
     EXPECT_EQ("D", Selected());
 
     Arrange("A B", "A");
     const CPoint pt = LabelPoint("B");
     PostMove(CPoint(pt.x, pt.y + 30), MK_RBUTTON);
-    {
-        PressWatchdog watchdog;
-        m_tree.OnButtonDown(FALSE, MK_RBUTTON, pt);
-    }
+    RightPress(pt);
     orvane_test::PumpUntilIdle(50);
     EXPECT_EQ("*rdrag:+B", LastCode());
     EXPECT_EQ("A B", Selected());

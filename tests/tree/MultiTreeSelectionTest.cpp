@@ -10,8 +10,6 @@
 // - run-time classes.
 #include "TreeHarness.h"
 
-#include "Input.h"
-
 using namespace tree_test;
 using orvane_test::KeyStateGuard;
 using orvane_test::SendKey;

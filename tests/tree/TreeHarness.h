@@ -15,10 +15,12 @@
 #include <gtest/gtest.h>
 
 #include "CMultiTree.h"
+#include "CallLater.h"
 #include "Input.h"
 #include "MsgSequence.h"
 #include "OrvaneLibrary.h"
 
+#include <functional>
 #include <map>
 #include <sstream>
 #include <string>
@@ -97,33 +99,6 @@ protected:
             return CWnd::WindowProc(message, wParam, lParam);
         return 0;
     }
-};
-
-// Bounds a press: the press loops end when the control loses the capture, so a loop still
-// running after five seconds has the capture taken away, and the test fails.
-class PressWatchdog
-{
-public:
-    PressWatchdog() : m_timer(::SetTimer(NULL, 0, 5000, &Expired)) { Fired() = false; }
-    ~PressWatchdog()
-    {
-        ::KillTimer(NULL, m_timer);
-        EXPECT_FALSE(Fired()) << "a press loop did not end by itself";
-    }
-
-private:
-    static bool& Fired()
-    {
-        static bool fired = false;
-        return fired;
-    }
-    static void CALLBACK Expired(HWND, UINT, UINT_PTR id, DWORD)
-    {
-        ::KillTimer(NULL, id);
-        Fired() = true;
-        ::ReleaseCapture();
-    }
-    UINT_PTR m_timer;
 };
 
 class TreeFixture : public testing::Test
@@ -309,11 +284,19 @@ protected:
     {
         m_tree.PostMessage(message, keys, MAKELPARAM(pt.x, pt.y));
     }
+    // Runs a press. The press loops end when the control loses the capture, so a loop still
+    // running after five seconds has the capture taken away, and the test fails.
+    void Bounded(const std::function<void()>& press)
+    {
+        orvane_test::CallLater watchdog(5000, [] { ::ReleaseCapture(); });
+        press();
+        EXPECT_FALSE(watchdog.fired()) << "a press loop did not end by itself";
+    }
     void SendButtonDown(CPoint pt, UINT keys = MK_LBUTTON)
     {
-        PressWatchdog watchdog;
-        m_tree.SendMessage(WM_LBUTTONDOWN, keys, MAKELPARAM(pt.x, pt.y));
+        Bounded([&] { m_tree.SendMessage(WM_LBUTTONDOWN, keys, MAKELPARAM(pt.x, pt.y)); });
     }
+    void RightPress(CPoint pt, UINT keys = MK_RBUTTON) { Bounded([&] { m_tree.OnButtonDown(FALSE, keys, pt); }); }
     // A click: the button-up queued, then the button-down sent.
     void Click(CPoint pt, UINT keys = 0)
     {

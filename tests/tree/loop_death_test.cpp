@@ -4,9 +4,6 @@
 // free, sends nothing more about the dead tree, and a new tree works as before.
 #include "TreeHarness.h"
 
-#include "CallLater.h"
-#include "Input.h"
-
 using namespace tree_test;
 using orvane_test::CallLater;
 
