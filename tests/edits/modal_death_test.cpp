@@ -20,12 +20,9 @@ std::string DeathName(const testing::TestParamInfo<Death>& info)
     return names[info.param];
 }
 
-class LoopDeath : public testing::TestWithParam<Death>
+class LoopDeath : public PageFixture, public testing::WithParamInterface<Death>
 {
 protected:
-    static void SetUpTestSuite() { orvane_test::LoadLibraryOnce(); }
-    void TearDown() override { dlg.DestroyWindow(); }
-
     // The dialog and the edit in control nId, each made again if its window died.
     void Open(UINT nId)
     {
@@ -44,7 +41,6 @@ protected:
         edit.calls.clear();
     }
 
-    TestDialog dlg;
     LongProbe edit;
 };
 
