@@ -130,8 +130,6 @@ public:
     std::string Message() const { return Narrow(static_cast<LPCTSTR>(this->m_strErrorMessage)); }
     int ErrorPos() const { return this->m_nErrorPos; }
     std::string Text() const { return Narrow(WindowText(this->m_hWnd)); }
-    const KVXVariant& Current() const { return this->m_varValue; }
-    const KVXVariant& CommittedValue() const { return this->m_varCommitted; }
 
     std::vector<std::string> calls;
     std::vector<std::string> shown;
