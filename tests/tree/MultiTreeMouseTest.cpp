@@ -16,15 +16,9 @@ using namespace tree_test;
 
 namespace {
 
-class MouseTest : public TreeFixture
+class MouseTest : public SmallTreeFixture
 {
 protected:
-    void SetUp() override
-    {
-        TreeFixture::SetUp();
-        Build(kSmallTree);
-    }
-
     // Press at pt with the messages queued before; the probe runs first in the loop. A move
     // at x = -1 stands for an Escape key press.
     void Press(CPoint pt, UINT keys, const std::vector<CPoint>& moves)

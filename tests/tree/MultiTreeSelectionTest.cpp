@@ -60,15 +60,7 @@ const StateCase kStateCases[] = {
       "A B", "", S, nullptr },
 };
 
-class SelectionTest : public TreeFixture
-{
-protected:
-    void SetUp() override
-    {
-        TreeFixture::SetUp();
-        Build(kSmallTree);
-    }
-};
+using SelectionTest = SmallTreeFixture;
 
 TEST_F(SelectionTest, SetItemStateRequests)
 {

@@ -314,4 +314,15 @@ protected:
     std::vector<std::string> m_selectionAtClick;   // the selection at each NM_CLICK
 };
 
+// The fixture with kSmallTree built.
+class SmallTreeFixture : public TreeFixture
+{
+protected:
+    void SetUp() override
+    {
+        TreeFixture::SetUp();
+        Build(kSmallTree);
+    }
+};
+
 } // namespace tree_test

@@ -23,12 +23,11 @@ const DeathCase kDeaths[] = {
     { "BandTopLevelDestroyed", true, true },
 };
 
-class LoopDeathTest : public TreeFixture, public testing::WithParamInterface<DeathCase> {};
+class LoopDeathTest : public SmallTreeFixture, public testing::WithParamInterface<DeathCase> {};
 
 TEST_P(LoopDeathTest, LoopEndsAtOnceAndANewTreeWorks)
 {
     const DeathCase& c = GetParam();
-    Build(kSmallTree);
     const CPoint press = c.band ? RightOfLabel("B") : LabelPoint("B");
     PointCursorAt(press);
     CallLater kill(30, [&] {
