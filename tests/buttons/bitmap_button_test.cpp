@@ -59,16 +59,12 @@ protected:
 
     CStatic* Make(Kind kind, UINT normal = 0, UINT pressed = 0, UINT disabled = 0, DWORD key = kMagenta)
     {
-        if (kind == Push)
-            m_push.SetBitmaps(normal, pressed, disabled, key);
-        else if (kind == Uncheck)
-            m_uncheck.SetBitmaps(normal, pressed, disabled, key);
-        else
-            m_check.SetBitmaps(normal, pressed, disabled, key);
-        CStatic* button = kind == Push ? static_cast<CStatic*>(&m_push)
-                          : kind == Uncheck ? static_cast<CStatic*>(&m_uncheck) : &m_check;
-        EXPECT_TRUE(button->Create(_T(""), WS_CHILD | WS_VISIBLE | SS_NOTIFY, CRect(10, 10, 42, 42), m_parent.get(), kId));
-        return button;
+        auto make = [&](auto& button) -> CStatic* {
+            button.SetBitmaps(normal, pressed, disabled, key);
+            EXPECT_TRUE(button.Create(_T(""), WS_CHILD | WS_VISIBLE | SS_NOTIFY, CRect(10, 10, 42, 42), m_parent.get(), kId));
+            return &button;
+        };
+        return kind == Push ? make(m_push) : kind == Uncheck ? make(m_uncheck) : make(m_check);
     }
     void Run(HWND h, const std::string& script)
     {
