@@ -61,7 +61,8 @@ protected:
     {
         auto make = [&](auto& button) -> CStatic* {
             button.SetBitmaps(normal, pressed, disabled, key);
-            EXPECT_TRUE(button.Create(_T(""), WS_CHILD | WS_VISIBLE | SS_NOTIFY, CRect(10, 10, 42, 42), m_parent.get(), kId));
+            const DWORD style = WS_CHILD | WS_VISIBLE | SS_NOTIFY;
+            EXPECT_TRUE(button.Create(_T(""), style, CRect(10, 10, 42, 42), m_parent.get(), kId));
             return &button;
         };
         return kind == Push ? make(m_push) : kind == Uncheck ? make(m_uncheck) : make(m_check);
