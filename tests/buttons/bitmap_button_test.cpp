@@ -5,21 +5,10 @@
 //    pressed state;
 //  - the looks painted per class and state, read back as pixels: normal, pressed, checked,
 //    disabled, greyed normal bitmap, key colour magenta and -1, no bitmap.
-#include <afxwin.h>
-
-#include <gtest/gtest.h>
-
-#include <functional>
-#include <memory>
-#include <string>
-
 #include "ButtonsTestSupport.h"
-#include "Input.h"
 #include "KVXBitmapButtonEx.h"
 #include "KVXCheckButtonEx.h"
 #include "KVXUncheckButton.h"
-#include "MsgSequence.h"
-#include "Pixels.h"
 #include "buttons_test_ids.h"
 
 namespace {
@@ -70,16 +59,13 @@ protected:
 
     CStatic* Make(Kind kind, UINT normal = 0, UINT pressed = 0, UINT disabled = 0, DWORD key = kMagenta)
     {
-        if (kind == Push)
-            m_push.SetBitmaps(normal, pressed, disabled, key);
-        else if (kind == Uncheck)
-            m_uncheck.SetBitmaps(normal, pressed, disabled, key);
-        else
-            m_check.SetBitmaps(normal, pressed, disabled, key);
-        CStatic* button = kind == Push ? static_cast<CStatic*>(&m_push)
-                          : kind == Uncheck ? static_cast<CStatic*>(&m_uncheck) : &m_check;
-        EXPECT_TRUE(button->Create(_T(""), WS_CHILD | WS_VISIBLE | SS_NOTIFY, CRect(10, 10, 42, 42), m_parent.get(), kId));
-        return button;
+        auto make = [&](auto& button) -> CStatic* {
+            button.SetBitmaps(normal, pressed, disabled, key);
+            const DWORD style = WS_CHILD | WS_VISIBLE | SS_NOTIFY;
+            EXPECT_TRUE(button.Create(_T(""), style, CRect(10, 10, 42, 42), m_parent.get(), kId));
+            return &button;
+        };
+        return kind == Push ? make(m_push) : kind == Uncheck ? make(m_uncheck) : make(m_check);
     }
     void Run(HWND h, const std::string& script)
     {
@@ -154,8 +140,8 @@ TEST_F(BitmapButtonTest, SetCheckDoesNotNotifyAndIsPressedWithoutWindowIsFalse)
 
 // The 16 x 16 test bitmaps sit centred at (8, 8) in the 32 x 32 client: columns 0-3 carry
 // the colour that names the bitmap (r normal, g pressed, b disabled), columns 4-15 bands of
-// key colour, mid-grey, black and white. A look is five letters for those probes:
-// r g b ident, F face, H highlight, S shadow, y grey 0x808080, k black, w white, . unchecked.
+// key colour, mid-grey, black and white. A look is five letters of Colour() for those
+// probes (r g b ident), '.' unchecked.
 struct LookCase
 {
     const char* name;
@@ -176,22 +162,6 @@ const LookCase kLookCases[] = {
     { "CheckUncheckedButHeldShowsThePressedBitmap", Check, IDB_TEST_DISABLED, "D U D", "g...." },
     { "CheckUncheckedReleased", Check, IDB_TEST_DISABLED, "D U D U", "r...." },
 };
-
-COLORREF Colour(char c)
-{
-    switch (c)
-    {
-    case 'r': return RGB(255, 0, 0);
-    case 'g': return RGB(0, 255, 0);
-    case 'b': return RGB(0, 0, 255);
-    case 'F': return Face();
-    case 'H': return Hi();
-    case 'S': return Sh();
-    case 'y': return 0x808080;
-    case 'k': return 0;
-    default: return 0xFFFFFF;
-    }
-}
 
 class BitmapButtonLook : public BitmapButtonTest, public ::testing::WithParamInterface<LookCase> {};
 

@@ -9,20 +9,8 @@
 //    outside (no message); the keyboard, the Other... button among the moves, Return;
 //  - Other... with the standard dialog answered OK and cancelled (capture kept);
 //  - setter ranges, defaults, KVXColorDialog's caption and run-time class.
-#include <afxwin.h>
-
-#include <gtest/gtest.h>
-
-#include <memory>
-#include <string>
-#include <vector>
-
 #include "ButtonsTestSupport.h"
-#include "Input.h"
 #include "KVXColorDialog.h"
-#include "KVXColorWell.h"
-#include "MsgSequence.h"
-#include "Pixels.h"
 #include "resource.h"
 
 namespace {
@@ -31,8 +19,6 @@ using namespace buttons_test;
 using orvane_test::ClientCapture;
 using orvane_test::ModalScript;
 using orvane_test::PointParam;
-
-constexpr UINT kWellId = 2001;
 
 // The default palette layout (5 rows, 4 columns of 20 x 20), with gaps as a test sets them.
 struct Grid
@@ -89,22 +75,9 @@ ModalScript::Step Mouse(UINT message, WPARAM keys, POINT pt)
 std::wstring Caption(HWND hwnd) { return orvane_test::WindowText(hwnd); }
 bool IsColorDialog(HWND hwnd) { return ::GetDlgItem(hwnd, 706) != NULL; }
 
-class ColorWellTest : public ::testing::Test
+class ColorWellTest : public WellFixture
 {
 protected:
-    void SetUp() override
-    {
-        m_parent = std::make_unique<TestParent>(100, 100);
-        ASSERT_TRUE(m_well.Create(_T(""), WS_CHILD | WS_VISIBLE | WS_TABSTOP | BS_OWNERDRAW, CRect(20, 20, 100, 44),
-                                  m_parent.get(), kWellId));
-        m_spy = std::make_unique<orvane_test::NotifySpy>(m_parent->m_hWnd, WM_KVX_COLORWELLCHANGED,
-                                                         sizeof(KVXColorWellNotify), false, WM_KVX_COLORWELLCHANGED);
-    }
-    void TearDown() override
-    {
-        m_spy.reset();
-        ::ReleaseCapture();
-    }
     // Runs the popup with the given steps; every script must close the popup itself.
     void RunPopup(std::vector<ModalScript::Step> steps)
     {
@@ -113,23 +86,10 @@ protected:
         EXPECT_TRUE(script.finished()) << "steps done: " << script.stepsDone();
         EXPECT_EQ(nullptr, ::GetCapture());
     }
-    // The colour of the i-th message and its record; the well's own handle and id in it.
-    COLORREF Notified(size_t i) const
-    {
-        const auto* n = reinterpret_cast<const KVXColorWellNotify*>(m_spy->payloads().at(i).data());
-        EXPECT_EQ(kWellId, m_spy->senders().at(i));
-        EXPECT_EQ(m_well.m_hWnd, n->hdr.hwndFrom);
-        EXPECT_EQ(kWellId, n->hdr.idFrom);
-        return n->clrColor;
-    }
-
-    std::unique_ptr<TestParent> m_parent;
-    KVXColorWell m_well;
-    std::unique_ptr<orvane_test::NotifySpy> m_spy;
 };
 
-// Pixels of the 80 x 24 well (arrow middle at y 12) per state: s swatch colour, k black,
-// F face, H highlight, S shadow, w white.
+// Pixels of the 80 x 24 well (arrow middle at y 12) per state: s swatch colour, else the
+// letters of Colour().
 struct PixelCase
 {
     const char* state;
@@ -173,8 +133,7 @@ TEST_F(ColorWellTest, DrawingPerState)
         {
             if (p.state != state)
                 continue;
-            const COLORREF expected = p.colour == 's' ? swatch : p.colour == 'k' ? 0 : p.colour == 'F' ? Face()
-                                      : p.colour == 'H' ? Hi() : p.colour == 'S' ? Sh() : 0xFFFFFF;
+            const COLORREF expected = p.colour == 's' ? swatch : Colour(p.colour);
             EXPECT_EQ(Hex(expected), Hex(cap.At(p.x, p.y))) << state << " at " << p.x << "," << p.y;
         }
         if (state == "disabled")

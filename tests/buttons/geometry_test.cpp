@@ -225,6 +225,10 @@ const COLORREF kHi = kColors.highlight;
 const COLORREF kSh = kColors.shadow;
 const COLORREF kMagenta = 0xFF00FF;
 
+using ColourMap = std::vector<std::pair<COLORREF, COLORREF>>;
+const ColourMap kPressedMap = { { kMagenta, kFace }, { 0x808080, kSh }, { 0xFFFFFF, kHi } };
+const ColourMap kGreyedMap = { { kMagenta, kFace }, { 0x808080, kHi }, { 0x000000, kSh } };
+
 struct LookCase
 {
     const char* name;
@@ -234,29 +238,24 @@ struct LookCase
     UINT normal, pressedBitmap, disabled;
     COLORREF key;
     UINT bitmap;
-    std::vector<std::pair<COLORREF, COLORREF>> map;
+    ColourMap map;
 };
 
 const LookCase kLookCases[] = {
     { "PushNormal", Kind::Push, false, true, 101, 102, 103, kMagenta, 101, { { kMagenta, kFace } } },
-    { "PushPressed", Kind::Push, true, true, 101, 102, 103, kMagenta, 102,
-      { { kMagenta, kFace }, { 0x808080, kSh }, { 0xFFFFFF, kHi } } },
-    { "PushPressedDisabledIgnoresEnable", Kind::Push, true, false, 101, 102, 103, kMagenta, 102,
-      { { kMagenta, kFace }, { 0x808080, kSh }, { 0xFFFFFF, kHi } } },
+    { "PushPressed", Kind::Push, true, true, 101, 102, 103, kMagenta, 102, kPressedMap },
+    { "PushPressedDisabledIgnoresEnable", Kind::Push, true, false, 101, 102, 103, kMagenta, 102, kPressedMap },
     { "PushDisabled", Kind::Push, false, false, 101, 102, 103, kMagenta, 103, { { kMagenta, kFace } } },
-    { "PushGreyedWithoutDisabledBitmap", Kind::Push, false, false, 101, 102, 0, kMagenta, 101,
-      { { kMagenta, kFace }, { 0x808080, kHi }, { 0x000000, kSh } } },
+    { "PushGreyedWithoutDisabledBitmap", Kind::Push, false, false, 101, 102, 0, kMagenta, 101, kGreyedMap },
     { "PushNothingWithoutBitmaps", Kind::Push, false, false, 0, 102, 0, kMagenta, 0, {} },
     { "PushPressedWithoutPressedBitmap", Kind::Push, true, true, 101, 0, 103, kMagenta, 0, {} },
-    { "MomentaryPressed", Kind::Momentary, true, true, 101, 102, 103, kMagenta, 102,
-      { { kMagenta, kFace }, { 0x808080, kSh }, { 0xFFFFFF, kHi } } },
+    { "MomentaryPressed", Kind::Momentary, true, true, 101, 102, 103, kMagenta, 102, kPressedMap },
     { "CheckNormalKeyIsFace", Kind::Check, false, true, 101, 102, 103, 0xFFFFFFFF, 101, { { kFace, kFace } } },
     { "CheckCheckedLightsKey", Kind::Check, true, true, 101, 102, 103, 0xFFFFFFFF, 102,
       { { kFace, kHi }, { 0x808080, kSh }, { 0xFFFFFF, kHi } } },
     { "CheckCheckedDisabled", Kind::Check, true, false, 101, 102, 103, kMagenta, 102,
       { { kMagenta, kFace }, { 0x808080, kHi }, { 0x000000, kSh }, { 0xFFFFFF, kHi } } },
-    { "CheckGreyed", Kind::Check, false, false, 101, 102, 0, kMagenta, 101,
-      { { kMagenta, kFace }, { 0x808080, kHi }, { 0x000000, kSh } } },
+    { "CheckGreyed", Kind::Check, false, false, 101, 102, 0, kMagenta, 101, kGreyedMap },
 };
 
 TEST(BitmapButtonLook, BitmapAndMap)
@@ -266,7 +265,7 @@ TEST(BitmapButtonLook, BitmapAndMap)
         const ButtonLook::Look look = ButtonLook::Choose(c.kind, c.pressed, c.enabled, c.normal, c.pressedBitmap,
                                                          c.disabled, c.key, kColors);
         EXPECT_EQ(c.bitmap, look.bitmap) << c.name;
-        std::vector<std::pair<COLORREF, COLORREF>> map;
+        ColourMap map;
         for (int i = 0; i < look.mapCount; ++i)
             map.emplace_back(look.map[i].from, look.map[i].to);
         EXPECT_EQ(c.map, map) << c.name;

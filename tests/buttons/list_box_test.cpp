@@ -4,15 +4,10 @@
 //    it; reset sets 0; empty strings never count in a recomputation;
 //  - filling from a directory recomputes; without a font every extent is 0;
 //  - an owner-drawn list box without strings keeps its item data out of the arithmetic.
-#include <afxwin.h>
-
-#include <gtest/gtest.h>
+#include "ButtonsTestSupport.h"
 
 #include <algorithm>
-#include <memory>
-#include <string>
 
-#include "ButtonsTestSupport.h"
 #include "KVXListBoxEx.h"
 
 namespace {

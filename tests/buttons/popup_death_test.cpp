@@ -3,16 +3,7 @@
 // window. The loops end by themselves (before the script's time limit would cancel
 // them), the capture is free, the parent gets no colour message, and a new well picks
 // a colour as before.
-#include <afxwin.h>
-
-#include <gtest/gtest.h>
-
-#include <memory>
-
 #include "ButtonsTestSupport.h"
-#include "Input.h"
-#include "MsgSequence.h"
-#include "KVXColorWell.h"
 #include "resource.h"
 
 namespace {
@@ -33,30 +24,7 @@ const DeathCase kDeaths[] = {
     { "ColorDialogTopLevelDestroyed", true, true },
 };
 
-class PopupDeathTest : public testing::TestWithParam<DeathCase>
-{
-protected:
-    void SetUp() override { Open(); }
-    void TearDown() override { Close(); }
-
-    void Open()
-    {
-        m_parent = std::make_unique<buttons_test::TestParent>(100, 100);
-        ASSERT_TRUE(m_well.Create(_T(""), WS_CHILD | WS_VISIBLE | BS_OWNERDRAW, CRect(20, 20, 100, 44), m_parent.get(), 7));
-        m_recorder = std::make_unique<orvane_test::NotifySpy>(m_parent->m_hWnd, WM_KVX_COLORWELLCHANGED,
-                                                             sizeof(KVXColorWellNotify), false, WM_KVX_COLORWELLCHANGED);
-    }
-    void Close()
-    {
-        m_recorder.reset();
-        m_well.DestroyWindow();
-        m_parent.reset();
-    }
-
-    std::unique_ptr<buttons_test::TestParent> m_parent;
-    KVXColorWell m_well;
-    std::unique_ptr<orvane_test::NotifySpy> m_recorder;
-};
+class PopupDeathTest : public buttons_test::WellFixture, public testing::WithParamInterface<DeathCase> {};
 
 TEST_P(PopupDeathTest, LoopsEndWithTheWellAndANewWellWorks)
 {
@@ -83,15 +51,15 @@ TEST_P(PopupDeathTest, LoopsEndWithTheWellAndANewWellWorks)
     }
     EXPECT_FALSE(::IsWindow(hPopup));
     EXPECT_EQ(nullptr, ::GetCapture());
-    EXPECT_EQ(0, m_recorder->count());
+    EXPECT_EQ(0, m_spy->count());
 
     Close();
     Open();
     // Row 1, column 2 of the default palette: white.
     ModalScript pick({ [](HWND hDialog) { return ::PostMessage(hDialog, WM_LBUTTONUP, 0, MAKELPARAM(50, 30)) != FALSE; } });
     m_well.DoColorWellDlg();
-    ASSERT_EQ(1, m_recorder->count());
-    EXPECT_EQ(RGB(255, 255, 255), reinterpret_cast<const KVXColorWellNotify*>(m_recorder->payloads()[0].data())->clrColor);
+    ASSERT_EQ(1, m_spy->count());
+    EXPECT_EQ(buttons_test::Hex(RGB(255, 255, 255)), buttons_test::Hex(Notified(0)));
 }
 
 INSTANTIATE_TEST_SUITE_P(Buttons, PopupDeathTest, testing::ValuesIn(kDeaths),

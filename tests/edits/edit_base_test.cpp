@@ -95,14 +95,12 @@ private:
     }
 };
 
-class EditBase : public testing::Test
+class EditBase : public PageFixture
 {
 protected:
-    static void SetUpTestSuite() { orvane_test::LoadLibraryOnce(); }
-
     void SetUp() override
     {
-        ASSERT_TRUE(dlg.Open());
+        PageFixture::SetUp();
         ASSERT_TRUE(edit1.SubclassDlgItem(kIdEdit1, &dlg));
         ASSERT_TRUE(edit2.SubclassDlgItem(kIdEdit2, &dlg));
         edit1.InitErrorHandling(dlg.m_hWnd, TRUE);   // as a host page does when it starts
@@ -113,8 +111,7 @@ protected:
     void TearDown() override
     {
         edit1.InitErrorHandling(dlg.m_hWnd, FALSE);
-        dlg.DestroyWindow();
-        PumpDialog(NULL);
+        PageFixture::TearDown();
     }
 
     // Types into edit1 and leaves it invalid at position 2 ("12x45").
@@ -131,7 +128,6 @@ protected:
         PumpDialog(dlg);
     }
 
-    TestDialog dlg;
     ProbeEdit edit1;
     ProbeEdit edit2;
 };

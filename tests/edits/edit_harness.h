@@ -86,8 +86,9 @@ protected:
     void OnCancel() override {}
 };
 
-// Answers every message box with OK and keeps its text; dialogs without the message
-// box's text static (the test dialogs themselves) are left alone.
+// Keeps the text and window of every message box and answers it with OK while `answer`
+// is set; dialogs without the message box's text static (the test dialogs themselves) are
+// left alone.
 class BoxRecorder
 {
 public:
@@ -96,12 +97,16 @@ public:
               if (::GetDlgItem(seen.hwnd, 0xFFFF) == NULL)
                   return 0;
               m_texts.push_back(Narrow(seen.text));
-              return static_cast<int>(IDOK);
+              hwnds.push_back(seen.hwnd);
+              return answer ? static_cast<int>(IDOK) : 0;
           })
     {
     }
     int count() const { return static_cast<int>(m_texts.size()); }
     std::string last() const { return m_texts.empty() ? std::string("<no box>") : m_texts.back(); }
+
+    bool answer = true;
+    std::vector<HWND> hwnds;
 
 private:
     std::vector<std::string> m_texts;
@@ -130,8 +135,6 @@ public:
     std::string Message() const { return Narrow(static_cast<LPCTSTR>(this->m_strErrorMessage)); }
     int ErrorPos() const { return this->m_nErrorPos; }
     std::string Text() const { return Narrow(WindowText(this->m_hWnd)); }
-    const KVXVariant& Current() const { return this->m_varValue; }
-    const KVXVariant& CommittedValue() const { return this->m_varCommitted; }
 
     std::vector<std::string> calls;
     std::vector<std::string> shown;
@@ -208,7 +211,7 @@ inline RECT RectInParent(HWND hwnd)
 }
 
 // A page with the library loaded; edits are created with Create at a rectangle of it.
-class NumericFixture : public testing::Test
+class PageFixture : public testing::Test
 {
 protected:
     static void SetUpTestSuite() { orvane_test::LoadLibraryOnce(); }

@@ -20,12 +20,9 @@ std::string DeathName(const testing::TestParamInfo<Death>& info)
     return names[info.param];
 }
 
-class LoopDeath : public testing::TestWithParam<Death>
+class LoopDeath : public PageFixture, public testing::WithParamInterface<Death>
 {
 protected:
-    static void SetUpTestSuite() { orvane_test::LoadLibraryOnce(); }
-    void TearDown() override { dlg.DestroyWindow(); }
-
     // The dialog and the edit in control nId, each made again if its window died.
     void Open(UINT nId)
     {
@@ -44,7 +41,6 @@ protected:
         edit.calls.clear();
     }
 
-    TestDialog dlg;
     LongProbe edit;
 };
 
@@ -52,25 +48,19 @@ using ErrorBoxDeath = LoopDeath;
 
 TEST_P(ErrorBoxDeath, ShowingEndsOnEveryWayOutOfTheBox)
 {
-    std::vector<HWND> boxes;
-    bool bAnswer = false;
-    orvane_test::DialogAnswerer answerer([&](const orvane_test::DialogAnswerer::Seen& seen) {
-        if (::GetDlgItem(seen.hwnd, 0xFFFF) == NULL)
-            return 0;   // the test dialog itself
-        boxes.push_back(seen.hwnd);
-        return bAnswer ? IDOK : 0;
-    });
+    BoxRecorder boxes;
+    boxes.answer = false;
     Open(kIdEdit1);
     edit.SetWindowText(_T("12x"));
     {
         CallLater kill(30, [&] { Kill(); });
         // The edit's own death leaves the box to its owner: closed here.
-        CallLater close(1000, [&] { ::PostMessageW(boxes.back(), WM_COMMAND, IDOK, 0); });
+        CallLater close(1000, [&] { ::PostMessageW(boxes.hwnds.back(), WM_COMMAND, IDOK, 0); });
         edit.SendMessage(WM_KVX_SHOWERRORMESSAGE);
         EXPECT_TRUE(kill.fired());
         EXPECT_EQ(GetParam() == kEditDies, close.fired());
     }
-    ASSERT_EQ(1u, boxes.size());
+    ASSERT_EQ(1, boxes.count());
     MSG msg = {};
     const bool bQuit = ::PeekMessageW(&msg, NULL, WM_QUIT, WM_QUIT, PM_REMOVE) != FALSE;
     EXPECT_EQ(GetParam() == kQuitPosted, bQuit);
@@ -78,9 +68,9 @@ TEST_P(ErrorBoxDeath, ShowingEndsOnEveryWayOutOfTheBox)
 
     Open(kIdEdit2);
     edit.SetWindowText(_T("34x"));
-    bAnswer = true;
+    boxes.answer = true;
     edit.SendMessage(WM_KVX_SHOWERRORMESSAGE);
-    EXPECT_EQ(2u, boxes.size()) << "the next error shows no box";
+    EXPECT_EQ(2, boxes.count()) << "the next error shows no box";
 }
 
 INSTANTIATE_TEST_SUITE_P(Edits, ErrorBoxDeath, testing::Values(kEditDies, kDialogDies, kQuitPosted), DeathName);

@@ -15,11 +15,10 @@ struct CountingLongEdit : KVXLongEdit
     int SetValueAsVariant(KVXVariant v, int bCommit) override { ++nShown; return KVXLongEdit::SetValueAsVariant(v, bCommit); }
 };
 
-TEST(NumericEditCreate, InitialisesOnceWhetherCreatedOrSubclassed)
+using NumericEditCreate = PageFixture;
+
+TEST_F(NumericEditCreate, InitialisesOnceWhetherCreatedOrSubclassed)
 {
-    orvane_test::LoadLibraryOnce();
-    TestDialog dlg;
-    ASSERT_TRUE(dlg.Open());
     CountingLongEdit created;
     CountingLongEdit subclassed;
     ASSERT_TRUE(created.Create(WS_CHILD | WS_VISIBLE | WS_BORDER, CRect(10, 80, 90, 100), &dlg, 2001));
@@ -27,7 +26,6 @@ TEST(NumericEditCreate, InitialisesOnceWhetherCreatedOrSubclassed)
     EXPECT_EQ(1, created.nShown);
     EXPECT_EQ(1, subclassed.nShown);
     EXPECT_EQ("0", Narrow(WindowText(created)));
-    dlg.DestroyWindow();
 }
 
 } // namespace

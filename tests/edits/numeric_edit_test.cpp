@@ -21,12 +21,12 @@ using namespace edit_test;
 using orvane_test::KeyStateGuard;
 using orvane_test::SendChars;
 
-class LongEdit : public NumericFixture
+class LongEdit : public PageFixture
 {
 protected:
     void SetUp() override
     {
-        NumericFixture::SetUp();
+        PageFixture::SetUp();
         CreateIn(edit, CRect(10, 20, 140, 41));
         edit.SetFocus();
     }
@@ -296,50 +296,6 @@ TEST_F(LongEdit, FocusLossAndSteppingOutOfAnEmptyField)
     EXPECT_EQ("6", edit.Text());
 }
 
-TEST_F(LongEdit, CtrlZShowsTheCommittedValueOrEmptiesAnUndefinedField)
-{
-    DoubleProbe real;
-    CreateIn(real, CRect(10, 50, 240, 71), 2002);
-    edit.SetValue(5, TRUE);
-    real.SetValue(1.25, TRUE);
-    Type(edit, L"57");
-    Type(real, L"7.5");
-    CtrlZ(edit);
-    CtrlZ(real);
-    EXPECT_EQ("5", edit.Text());
-    EXPECT_EQ("1.25", real.Text());
-    EXPECT_FALSE(edit.GetModified());
-    EXPECT_FALSE(real.GetModified());
-
-    edit.SetUndefined(TRUE);
-    real.SetUndefined(TRUE);
-    Type(edit, L"8");
-    Type(real, L"3");
-    CtrlZ(edit);
-    CtrlZ(real);
-    EXPECT_EQ("", edit.Text());
-    EXPECT_EQ("", real.Text());
-    EXPECT_TRUE(edit.GetUndefined());
-}
-
-TEST_F(LongEdit, FiltersPassTheirAlphabetPastedTextOnlyMeetsTheCheck)
-{
-    DoubleProbe real;
-    CreateIn(real, CRect(10, 50, 240, 71), 2002);
-    Type(edit, L"-0x2 g$aB");
-    EXPECT_EQ("-0x2$aB", edit.Text());
-    Type(real, L"-1a.5 E+2x");
-    EXPECT_EQ("-1.5E+2", real.Text());
-    EXPECT_EQ(-150.0, real.CurrentDouble());
-
-    ASSERT_TRUE(orvane_test::SetClipboardText(dlg, L"1 2"));
-    edit.SetSel(0, -1);
-    ::SendMessageW(edit, WM_PASTE, 0, 0);
-    EXPECT_EQ("1 2", edit.Text());
-    EXPECT_EQ(LoadText(IDS_DECIMAL_SYNTAX), edit.Message());
-    EXPECT_EQ(1, edit.ErrorPos());
-}
-
 TEST_F(LongEdit, InvalidFieldReadsAsItsCommittedValueAndIsRestoredWhenDisabled)
 {
     edit.SetValue(12, TRUE);
@@ -352,25 +308,6 @@ TEST_F(LongEdit, InvalidFieldReadsAsItsCommittedValueAndIsRestoredWhenDisabled)
     edit.EnableWindow(FALSE);
     EXPECT_EQ("14", edit.Text());
     EXPECT_EQ(nullptr, KVXEdit::FindErrorOnPage(dlg));
-}
-
-TEST_F(LongEdit, NonConvertibleVariantsChangeNothing)
-{
-    DoubleProbe real;
-    CreateIn(real, CRect(10, 50, 240, 71), 2002);
-    edit.SetValue(3, TRUE);
-    real.SetValue(0.5, TRUE);
-    VARIANT null;
-    ::VariantInit(&null);
-    null.vt = VT_NULL;
-    EXPECT_FALSE(edit.SetValueAsVariant(KVXVariant(null), TRUE));
-    EXPECT_FALSE(edit.SetValueAsVariant(KVXVariant(KVXString(_T("abc"))), TRUE));
-    EXPECT_FALSE(real.SetValueAsVariant(KVXVariant(KVXString(_T("x"))), TRUE));
-    EXPECT_EQ("3", edit.Text());
-    EXPECT_EQ(3, edit.CommittedLong());
-    EXPECT_EQ("0.5", real.Text());
-    EXPECT_TRUE(real.SetValueAsVariant(KVXVariant(7L), TRUE));
-    EXPECT_EQ("7", real.Text());
 }
 
 // --- the spin's ownership -------------------------------------------------------
@@ -532,6 +469,63 @@ TEST_F(DoubleEdit, FixedDeltaAndTheRangeEnd)
     EXPECT_EQ(13.0, real.Middle());
     EXPECT_EQ(0, real.Offset());
     EXPECT_EQ(0.25, real.GetDelta());
+}
+
+TEST_F(DoubleEdit, CtrlZShowsTheCommittedValueOrEmptiesAnUndefinedField)
+{
+    edit.SetValue(5, TRUE);
+    real.SetValue(1.25, TRUE);
+    Type(edit, L"57");
+    Type(real, L"7.5");
+    CtrlZ(edit);
+    CtrlZ(real);
+    EXPECT_EQ("5", edit.Text());
+    EXPECT_EQ("1.25", real.Text());
+    EXPECT_FALSE(edit.GetModified());
+    EXPECT_FALSE(real.GetModified());
+
+    edit.SetUndefined(TRUE);
+    real.SetUndefined(TRUE);
+    Type(edit, L"8");
+    Type(real, L"3");
+    CtrlZ(edit);
+    CtrlZ(real);
+    EXPECT_EQ("", edit.Text());
+    EXPECT_EQ("", real.Text());
+    EXPECT_TRUE(edit.GetUndefined());
+}
+
+TEST_F(DoubleEdit, FiltersPassTheirAlphabetPastedTextOnlyMeetsTheCheck)
+{
+    Type(edit, L"-0x2 g$aB");
+    EXPECT_EQ("-0x2$aB", edit.Text());
+    Type(real, L"-1a.5 E+2x");
+    EXPECT_EQ("-1.5E+2", real.Text());
+    EXPECT_EQ(-150.0, real.CurrentDouble());
+
+    ASSERT_TRUE(orvane_test::SetClipboardText(dlg, L"1 2"));
+    edit.SetSel(0, -1);
+    ::SendMessageW(edit, WM_PASTE, 0, 0);
+    EXPECT_EQ("1 2", edit.Text());
+    EXPECT_EQ(LoadText(IDS_DECIMAL_SYNTAX), edit.Message());
+    EXPECT_EQ(1, edit.ErrorPos());
+}
+
+TEST_F(DoubleEdit, NonConvertibleVariantsChangeNothing)
+{
+    edit.SetValue(3, TRUE);
+    real.SetValue(0.5, TRUE);
+    VARIANT null;
+    ::VariantInit(&null);
+    null.vt = VT_NULL;
+    EXPECT_FALSE(edit.SetValueAsVariant(KVXVariant(null), TRUE));
+    EXPECT_FALSE(edit.SetValueAsVariant(KVXVariant(KVXString(_T("abc"))), TRUE));
+    EXPECT_FALSE(real.SetValueAsVariant(KVXVariant(KVXString(_T("x"))), TRUE));
+    EXPECT_EQ("3", edit.Text());
+    EXPECT_EQ(3, edit.CommittedLong());
+    EXPECT_EQ("0.5", real.Text());
+    EXPECT_TRUE(real.SetValueAsVariant(KVXVariant(7L), TRUE));
+    EXPECT_EQ("7", real.Text());
 }
 
 } // namespace

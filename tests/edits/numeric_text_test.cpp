@@ -7,19 +7,15 @@
 //  - the automatic delta table, exponent formats and a middle value of 0;
 //  - which printf formats take exactly one double.
 #include "NumberFormat.h"
-
+#include "edit_harness.h"
 #include "resource.h"
 
-#include <gtest/gtest.h>
-
 #include <climits>
-#include <string>
 
 namespace {
 
 using namespace NumberFormat;
-
-std::string Narrow(const std::wstring& w) { return std::string(w.begin(), w.end()); }
+using edit_test::Narrow;
 
 TEST(NumericCharFilter, IntegerAlphabetIsTheSameForEveryBaseFloatingPointItsOwn)
 {

@@ -4,22 +4,14 @@
 //  - glyph rectangles and points, raised and pressed;
 //  - timer tick rules (first repeat, two- and five-second calls) over a long hold;
 //  - the slider distance curve, both signs, its knee and absurd distances.
-#include "SpinGeometry.h"
-
-#include <gtest/gtest.h>
+#include "edit_harness.h"
 
 #include <climits>
-#include <string>
 
 namespace {
 
 using namespace SpinGeometry;
-
-std::string Text(const RECT& r)
-{
-    return "(" + std::to_string(r.left) + "," + std::to_string(r.top) + "," + std::to_string(r.right) + ","
-        + std::to_string(r.bottom) + ")";
-}
+using edit_test::RectText;
 
 char AreaLetter(SpinArea a)
 {
@@ -28,11 +20,11 @@ char AreaLetter(SpinArea a)
 
 TEST(SpinBesideEdit, FifteenWideOneAboveRoundedDownToEvenHeight)
 {
-    EXPECT_EQ("(110,19,125,41)", Text(SpinRectBesideEdit(RECT{ 10, 20, 110, 41 })));   // 23 -> 22
-    EXPECT_EQ("(50,-1,65,21)", Text(SpinRectBesideEdit(RECT{ 0, 0, 50, 20 })));
-    EXPECT_EQ("(5,4,20,6)", Text(SpinRectBesideEdit(RECT{ 5, 5, 5, 5 })));
+    EXPECT_EQ("(110,19,125,41)", RectText(SpinRectBesideEdit(RECT{ 10, 20, 110, 41 })));   // 23 -> 22
+    EXPECT_EQ("(50,-1,65,21)", RectText(SpinRectBesideEdit(RECT{ 0, 0, 50, 20 })));
+    EXPECT_EQ("(5,4,20,6)", RectText(SpinRectBesideEdit(RECT{ 5, 5, 5, 5 })));
     // A reversed rectangle yields a reversed (empty) spin, not garbage.
-    EXPECT_EQ("(40,49,55,41)", Text(SpinRectBesideEdit(RECT{ 100, 50, 40, 40 })));
+    EXPECT_EQ("(40,49,55,41)", RectText(SpinRectBesideEdit(RECT{ 100, 50, 40, 40 })));
 }
 
 struct HitCase
@@ -81,14 +73,14 @@ TEST(SpinHitTest, EveryRowHitsExactlyOneAreaUpFourBandRowsThenDown)
 
 TEST(SpinHalves, HitRectanglesAndPaintedHalves)
 {
-    EXPECT_EQ("(0,0,15,8)", Text(UpHitRect(15, 20)));
-    EXPECT_EQ("(0,8,15,12)", Text(SliderBandRect(15, 20)));
-    EXPECT_EQ("(0,12,15,20)", Text(DownHitRect(15, 20)));
+    EXPECT_EQ("(0,0,15,8)", RectText(UpHitRect(15, 20)));
+    EXPECT_EQ("(0,8,15,12)", RectText(SliderBandRect(15, 20)));
+    EXPECT_EQ("(0,12,15,20)", RectText(DownHitRect(15, 20)));
     // Painting splits an even height; an odd one leaves the middle row to neither half.
-    EXPECT_EQ("(0,0,15,10)", Text(UpperHalfRect(15, 20)));
-    EXPECT_EQ("(0,10,15,20)", Text(LowerHalfRect(15, 20)));
-    EXPECT_EQ("(0,0,15,10)", Text(UpperHalfRect(15, 21)));
-    EXPECT_EQ("(0,11,15,21)", Text(LowerHalfRect(15, 21)));
+    EXPECT_EQ("(0,0,15,10)", RectText(UpperHalfRect(15, 20)));
+    EXPECT_EQ("(0,10,15,20)", RectText(LowerHalfRect(15, 20)));
+    EXPECT_EQ("(0,0,15,10)", RectText(UpperHalfRect(15, 21)));
+    EXPECT_EQ("(0,11,15,21)", RectText(LowerHalfRect(15, 21)));
 }
 
 struct GlyphCase
@@ -115,7 +107,7 @@ TEST(SpinGlyph, RectangleAndPoints)
     {
         SCOPED_TRACE(std::to_string(c.height) + (c.upper ? " up" : " down") + (c.pressed ? " pressed" : ""));
         const RECT glyph = GlyphRect(c.upper ? UpperHalfRect(15, c.height) : LowerHalfRect(15, c.height), c.pressed);
-        EXPECT_EQ(c.rect, Text(glyph));
+        EXPECT_EQ(c.rect, RectText(glyph));
         POINT pts[3];
         c.upper ? UpGlyphPoints(glyph, pts) : DownGlyphPoints(glyph, pts);
         for (int i = 0; i < 3; ++i)

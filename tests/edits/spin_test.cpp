@@ -26,29 +26,28 @@ using orvane_test::ClientCapture;
 using orvane_test::PointParam;
 using orvane_test::PumpUntilIdle;
 
-std::vector<std::string> Values(long first, long step, int count)
+// The values shown by runs of equal steps, each { first, step, count }.
+struct Run
 {
-    std::vector<std::string> v;
-    for (int i = 0; i < count; ++i)
-        v.push_back(std::to_string(first + step * i));
-    return v;
-}
-
-std::vector<std::string> Concat(std::initializer_list<std::vector<std::string>> parts)
+    long first, step;
+    int count;
+};
+std::vector<std::string> Shown(std::initializer_list<Run> runs)
 {
-    std::vector<std::string> all;
-    for (const auto& p : parts)
-        all.insert(all.end(), p.begin(), p.end());
-    return all;
+    std::vector<std::string> shown;
+    for (const Run& r : runs)
+        for (int i = 0; i < r.count; ++i)
+            shown.push_back(std::to_string(r.first + r.step * i));
+    return shown;
 }
 
 // An integer edit at (10, 20, 110, 41) showing 100, with its spin.
-class Spin : public NumericFixture
+class Spin : public PageFixture
 {
 protected:
     void SetUp() override
     {
-        NumericFixture::SetUp();
+        PageFixture::SetUp();
         CreateIn(edit, CRect(10, 20, 110, 41), 100);
         hSpin = edit.SpinHwnd();
         ASSERT_TRUE(::IsWindow(hSpin));
@@ -64,7 +63,7 @@ protected:
     {
         if (::IsWindow(hSpin))
             ::SendMessageW(hSpin, WM_LBUTTONUP, 0, 0);
-        NumericFixture::TearDown();
+        PageFixture::TearDown();
     }
 
     void Clear()
@@ -250,8 +249,8 @@ struct HoldCase
 // Press: one step; ticks 6-20 one each; the two-second call after the step of tick 20;
 // ticks 21-50 five each; the five-second call after tick 50; ticks 51-60 twenty each.
 const HoldCase kHoldCases[] = {
-    { "UpAccelerated", true, true, Concat({ Values(101, 1, 1), Values(102, 1, 15), Values(121, 5, 30), Values(286, 20, 10) }) },
-    { "DownPlain", false, false, Concat({ Values(99, -1, 1), Values(98, -1, 55) }) },
+    { "UpAccelerated", true, true, Shown({ { 101, 1, 1 }, { 102, 1, 15 }, { 121, 5, 30 }, { 286, 20, 10 } }) },
+    { "DownPlain", false, false, Shown({ { 99, -1, 1 }, { 98, -1, 55 } }) },
 };
 
 class SpinHold : public Spin, public ::testing::WithParamInterface<HoldCase> {};

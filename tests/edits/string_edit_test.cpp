@@ -13,6 +13,7 @@
 #include "KVXStringEdit.h"
 #include "StringEscapes.h"
 
+#include <memory>
 #include <string>
 
 namespace {
@@ -150,29 +151,28 @@ private:
 
 std::wstring Std(const KVXString& s) { return std::wstring((LPCTSTR)s, static_cast<size_t>(s.GetLength())); }
 
-class StringEditTest : public ::testing::Test
+class StringEditTest : public PageFixture
 {
 protected:
-    static void SetUpTestSuite() { orvane_test::LoadLibraryOnce(); }
-    void SetUp() override { ASSERT_TRUE(m_dlg.Open(L"String edit")); }
-
-    void Attach(StringEdit& edit)
+    // The edit made with these flags, subclassing the page's first edit.
+    StringEdit& Attach(int bReplaceSpecialChars = TRUE, int bAcceptSingleBackslash = TRUE)
     {
-        ASSERT_TRUE(edit.SubclassDlgItem(kIdEdit1, &m_dlg));
-        m_hEdit = edit.m_hWnd;
+        m_edit = std::make_unique<StringEdit>(bReplaceSpecialChars, bAcceptSingleBackslash);
+        EXPECT_TRUE(m_edit->SubclassDlgItem(kIdEdit1, &dlg));
+        m_hEdit = m_edit->m_hWnd;
+        return *m_edit;
     }
     void SetSel(int start, int end) { ::SendMessage(m_hEdit, EM_SETSEL, start, end); }
     void Paste() { ::SendMessage(m_hEdit, WM_PASTE, 0, 0); }
     std::wstring Text() const { return WindowText(m_hEdit); }
 
-    TestDialog m_dlg;
+    std::unique_ptr<StringEdit> m_edit;
     HWND m_hEdit = NULL;
 };
 
 TEST_F(StringEditTest, AcceptsTwoHundredFiftyFiveCharactersAndRefusesTheNext)
 {
-    StringEdit edit;
-    Attach(edit);
+    StringEdit& edit = Attach();
     EXPECT_EQ(255, edit.GetCharacterCount());
     SendChars(m_hEdit, std::wstring(255, L'a'));
     SendChars(m_hEdit, L"b");
@@ -183,14 +183,13 @@ TEST_F(StringEditTest, AcceptsTwoHundredFiftyFiveCharactersAndRefusesTheNext)
 
 TEST_F(StringEditTest, AtTheMaximumTypingOverASelectionIsRefusedPastingReplaces)
 {
-    StringEdit edit;
-    Attach(edit);
+    StringEdit& edit = Attach();
     edit.SetCharacterCount(5);
     SendChars(m_hEdit, L"abcde");
     SetSel(2, 3);
     SendChars(m_hEdit, L"Z");
     EXPECT_EQ(L"abcde", Text());
-    ASSERT_TRUE(SetClipboardAnsi(m_dlg, "Z"));
+    ASSERT_TRUE(SetClipboardAnsi(dlg, "Z"));
     SetSel(2, 3);
     Paste();
     EXPECT_EQ(L"abZde", Text());
@@ -208,10 +207,9 @@ TEST_F(StringEditTest, AtTheMaximumTypingOverASelectionIsRefusedPastingReplaces)
 
 TEST_F(StringEditTest, PasteIsCutToTheMaximumAndInsertsEverythingVerbatim)
 {
-    StringEdit edit(TRUE, FALSE);
-    Attach(edit);
+    StringEdit& edit = Attach(TRUE, FALSE);
     edit.SetCharacterCount(6);
-    ASSERT_TRUE(SetClipboardAnsi(m_dlg, "a\\b\tc\\de"));
+    ASSERT_TRUE(SetClipboardAnsi(dlg, "a\\b\tc\\de"));
     Paste();
     EXPECT_EQ(L"a\\b\tc\\", Text());
     EXPECT_EQ("6-6", Selection(m_hEdit));
@@ -219,11 +217,10 @@ TEST_F(StringEditTest, PasteIsCutToTheMaximumAndInsertsEverythingVerbatim)
 
 TEST_F(StringEditTest, ClipboardTextIsReadWithTheCodePageOrAsUnicode)
 {
-    StringEdit edit;
-    Attach(edit);
-    ASSERT_TRUE(SetClipboardAnsi(m_dlg, "caf\xE9 "));
+    StringEdit& edit = Attach();
+    ASSERT_TRUE(SetClipboardAnsi(dlg, "caf\xE9 "));
     Paste();
-    ASSERT_TRUE(SetClipboardText(m_dlg, L"\x03A9mega \x0416"));
+    ASSERT_TRUE(SetClipboardText(dlg, L"\x03A9mega \x0416"));
     {
         KeyStateGuard ctrl({ VK_CONTROL });
         ::SendMessage(m_hEdit, WM_CHAR, 0x16, 1);
@@ -233,11 +230,10 @@ TEST_F(StringEditTest, ClipboardTextIsReadWithTheCodePageOrAsUnicode)
 
 TEST_F(StringEditTest, ReadOnlyFieldIgnoresPaste)
 {
-    StringEdit edit;
-    Attach(edit);
+    StringEdit& edit = Attach();
     ::SendMessage(m_hEdit, EM_SETREADONLY, TRUE, 0);
     ::SetWindowTextW(m_hEdit, L"fixed");
-    ASSERT_TRUE(SetClipboardAnsi(m_dlg, "new"));
+    ASSERT_TRUE(SetClipboardAnsi(dlg, "new"));
     SetSel(0, -1);
     Paste();
     EXPECT_EQ(L"fixed", Text());
@@ -245,14 +241,13 @@ TEST_F(StringEditTest, ReadOnlyFieldIgnoresPaste)
 
 TEST_F(StringEditTest, DroppedBackslashesDoNotCountWhenTyping)
 {
-    StringEdit edit(TRUE, FALSE);
-    Attach(edit);
+    StringEdit& edit = Attach(TRUE, FALSE);
     edit.SetCharacterCount(3);
     SendChars(m_hEdit, L"ab\\c");   // the stray backslash will be dropped: "abc"
     SendChars(m_hEdit, L"d");
     EXPECT_EQ(L"ab\\c", Text());
     StringEdit counting;   // accepted backslashes count
-    ASSERT_TRUE(counting.SubclassDlgItem(kIdEdit2, &m_dlg));
+    ASSERT_TRUE(counting.SubclassDlgItem(kIdEdit2, &dlg));
     counting.SetCharacterCount(3);
     SendChars(counting.m_hWnd, L"ab\\c");
     EXPECT_EQ(L"ab\\", WindowText(counting.m_hWnd));
@@ -260,13 +255,11 @@ TEST_F(StringEditTest, DroppedBackslashesDoNotCountWhenTyping)
 
 TEST_F(StringEditTest, GetValueTranslatesTheShownText)
 {
-    StringEdit plain(FALSE, TRUE);
-    Attach(plain);
+    StringEdit& plain = Attach(FALSE, TRUE);
     ::SetWindowTextW(m_hEdit, L"a\\nb");
     EXPECT_EQ(L"a\\nb", Std(plain.GetValue(FALSE)));
     plain.UnsubclassWindow();
-    StringEdit edit(TRUE, FALSE);
-    Attach(edit);
+    StringEdit& edit = Attach(TRUE, FALSE);
     ::SetWindowTextW(m_hEdit, L"a\\n\\q\\");
     EXPECT_EQ(L"a\nq", Std(edit.GetValue(FALSE)));
     EXPECT_EQ(L"a\\n\\q\\", edit.Stored()) << "the stored text stays untranslated";
@@ -274,8 +267,7 @@ TEST_F(StringEditTest, GetValueTranslatesTheShownText)
 
 TEST_F(StringEditTest, SetValueRemovesStrayBackslashesAndCutsToTheMaximum)
 {
-    StringEdit edit(FALSE, FALSE);
-    Attach(edit);
+    StringEdit& edit = Attach(FALSE, FALSE);
     EXPECT_TRUE(edit.SetValue(KVXString(L"x\\\\\\ny\\"), FALSE));
     EXPECT_EQ(L"x\\\\\\ny", Text());
     EXPECT_EQ(L"x\\\\\\ny", edit.Stored());
@@ -297,8 +289,7 @@ TEST_F(StringEditTest, SetValueRemovesStrayBackslashesAndCutsToTheMaximum)
 
 TEST_F(StringEditTest, SetValueAsVariantTakesOnlyText)
 {
-    StringEdit edit;
-    Attach(edit);
+    StringEdit& edit = Attach();
     edit.SetValue(KVXString(L"keep"), TRUE);
     EXPECT_FALSE(edit.SetValueAsVariant(KVXVariant(42L), TRUE));
     EXPECT_FALSE(edit.SetValueAsVariant(KVXVariant(1.5), TRUE));

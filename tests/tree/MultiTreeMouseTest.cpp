@@ -12,23 +12,13 @@
 // - the highlight of every selected label, not only the caret's, follows the focus.
 #include "TreeHarness.h"
 
-#include "Input.h"
-
-#include <sstream>
-
 using namespace tree_test;
 
 namespace {
 
-class MouseTest : public TreeFixture
+class MouseTest : public SmallTreeFixture
 {
 protected:
-    void SetUp() override
-    {
-        TreeFixture::SetUp();
-        Build(kSmallTree);
-    }
-
     // Press at pt with the messages queued before; the probe runs first in the loop. A move
     // at x = -1 stands for an Escape key press.
     void Press(CPoint pt, UINT keys, const std::vector<CPoint>& moves)
@@ -45,12 +35,7 @@ protected:
         orvane_test::PumpUntilIdle(50);
     }
     std::string Probe() const { return m_parent.m_probes.empty() ? "<no probe>" : m_parent.m_probes.front(); }
-    std::string LastCode() const
-    {
-        const std::string trace = m_parent.Trace();
-        const size_t blank = trace.rfind(' ');
-        return blank == std::string::npos ? trace : trace.substr(blank + 1);
-    }
+    std::string LastCode() const { return m_trace.substr(m_trace.rfind(' ') + 1); }
     CPoint EmptySpaceBelowItems() const
     {
         CRect rcLast, rcClient;
@@ -136,12 +121,13 @@ TEST_F(MouseTest, Presses)
     for (const PressCase& c : kPressCases)
     {
         SCOPED_TRACE(c.name);
-        if (c.style != 0)
+        if (c.style != 0 || (m_tree.GetStyle() & TVS_DISABLEDRAGDROP) != 0)
         {
             CreateTree(c.style);
             Build(kSmallTree);
         }
         Arrange(c.before, c.caret);
+        orvane_test::NotifySpy drags(m_parent, TVN_BEGINDRAGW, sizeof(NMTREEVIEW));
         const CPoint press = At(c.at);
         Press(press, c.keys, Moves(c.moves, press));
         if (c.probe != nullptr)
@@ -151,30 +137,25 @@ TEST_F(MouseTest, Presses)
             EXPECT_EQ(c.caretAfter, Caret());
         if (std::string(c.last) == "-")
         {
-            EXPECT_EQ(nullptr, m_parent.Last(NM_CLICK)) << m_parent.Trace();
-            EXPECT_EQ(nullptr, m_parent.Last(TVN_BEGINDRAGW)) << m_parent.Trace();
+            EXPECT_FALSE(Traced("click")) << m_trace;
+            EXPECT_FALSE(Traced("drag")) << m_trace;
         }
         else
         {
-            EXPECT_EQ(c.last, LastCode()) << m_parent.Trace();
+            EXPECT_EQ(c.last, LastCode()) << m_trace;
             EXPECT_EQ(m_tree.m_hWnd, ::GetFocus());
         }
         EXPECT_EQ(nullptr, ::GetCapture());
-        if (const CRecordingParent::Record* drag = m_parent.Last(TVN_BEGINDRAGW))
+        if (drags.count() > 0)
         {
-            EXPECT_TRUE(drag->emulated);
-            EXPECT_EQ(LPARAM(m_tree.GetItemData(Item(drag->newName))), drag->newParam);
-            EXPECT_EQ(press.x, drag->ptDrag.x);
-            EXPECT_EQ(press.y, drag->ptDrag.y);
-            EXPECT_EQ(nullptr, m_parent.Last(NM_CLICK)) << "a drag is no click";
+            const NMTREEVIEW& drag = *reinterpret_cast<const NMTREEVIEW*>(drags.payloads().back().data());
+            EXPECT_EQ(LPARAM(m_tree.GetItemData(drag.itemNew.hItem)), drag.itemNew.lParam);
+            EXPECT_EQ(press.x, drag.ptDrag.x);
+            EXPECT_EQ(press.y, drag.ptDrag.y);
+            EXPECT_FALSE(Traced("click")) << "a drag is no click: " << m_trace;
         }
-        else if (!m_parent.m_selectionAtClick.empty())
-            EXPECT_EQ(c.selected, m_parent.m_selectionAtClick.back()) << "NM_CLICK comes after the selection";
-        if (c.style != 0)
-        {
-            CreateTree();
-            Build(kSmallTree);
-        }
+        else if (!m_selectionAtClick.empty())
+            EXPECT_EQ(c.selected, m_selectionAtClick.back()) << "NM_CLICK comes after the selection";
     }
 }
 
@@ -225,7 +206,7 @@ TEST_F(MouseTest, ExpandButtonAndStateIconAreHandledByTheTree)
     Click(PointWithHit("C", TVHT_ONITEMBUTTON));
     EXPECT_EQ(UINT(TVIS_EXPANDED), m_tree.GetItemState(Item("C"), TVIS_EXPANDED));
     EXPECT_EQ("B", Selected());
-    EXPECT_EQ(std::string::npos, m_parent.Trace().find('*')) << m_parent.Trace();
+    EXPECT_EQ(std::string::npos, m_trace.find('*')) << m_trace;
 
     CreateTree(TVS_CHECKBOXES);
     Build(kSmallTree);
@@ -234,7 +215,7 @@ TEST_F(MouseTest, ExpandButtonAndStateIconAreHandledByTheTree)
     Click(PointWithHit("B", TVHT_ONITEMSTATEICON));
     EXPECT_TRUE(m_tree.GetCheck(Item("B")));
     EXPECT_EQ("A", Selected());
-    EXPECT_EQ(std::string::npos, m_parent.Trace().find('*')) << m_parent.Trace();
+    EXPECT_EQ(std::string::npos, m_trace.find('*')) << m_trace;
 }
 
 TEST_F(MouseTest, RightButtonSelectsWithoutTouchingTheAnchorAndSendsRClickOrRDrag)
@@ -242,29 +223,20 @@ TEST_F(MouseTest, RightButtonSelectsWithoutTouchingTheAnchorAndSendsRClickOrRDra
     Arrange("A B", "A");
     m_tree.SetAnchor(Item("A"));
     PostButtonUp(LabelPoint("D"), 0, WM_RBUTTONUP);
-    {
-        PressWatchdog watchdog;
-        m_tree.OnButtonDown(FALSE, MK_RBUTTON, LabelPoint("D"));
-    }
+    RightPress(LabelPoint("D"));
     EXPECT_EQ("D", Selected());
     EXPECT_EQ("D", Caret());
     EXPECT_EQ(Item("A"), m_tree.Anchor());
     EXPECT_EQ("*rclick", LastCode());
     PostButtonUp(LabelPoint("B"), 0, WM_RBUTTONUP);
-    {
-        PressWatchdog watchdog;
-        m_tree.OnButtonDown(FALSE, MK_RBUTTON | MK_CONTROL, LabelPoint("B"));
-    }
+    RightPress(LabelPoint("B"), MK_RBUTTON | MK_CONTROL);
     EXPECT_EQ(Item("B"), m_tree.Anchor());
     EXPECT_EQ("D", Selected());
 
     Arrange("A B", "A");
     const CPoint pt = LabelPoint("B");
     PostMove(CPoint(pt.x, pt.y + 30), MK_RBUTTON);
-    {
-        PressWatchdog watchdog;
-        m_tree.OnButtonDown(FALSE, MK_RBUTTON, pt);
-    }
+    RightPress(pt);
     orvane_test::PumpUntilIdle(50);
     EXPECT_EQ("*rdrag:+B", LastCode());
     EXPECT_EQ("A B", Selected());
@@ -276,16 +248,16 @@ TEST_F(MouseTest, CaptureLostEndsAPressWithoutClickAndABandAsAfterARelease)
     ASSERT_TRUE(other.CreateEx(0, AfxRegisterWndClass(0), _T("other"), WS_POPUP, 0, 0, 10, 10, NULL, NULL));
     Arrange("A", "A");
     PointCursorAt(LabelPoint("C"));
-    m_parent.PostMessage(CRecordingParent::kCaptureMessage, reinterpret_cast<WPARAM>(other.m_hWnd));
+    m_parent.PostMessage(CTestParent::kCaptureMessage, reinterpret_cast<WPARAM>(other.m_hWnd));
     SendButtonDown(LabelPoint("C"));
     EXPECT_EQ(other.m_hWnd, ::GetCapture());   // the control did not release a capture it lost
     ::ReleaseCapture();
     EXPECT_EQ("C", Selected());
-    EXPECT_EQ(nullptr, m_parent.Last(NM_CLICK)) << m_parent.Trace();
-    EXPECT_EQ(nullptr, m_parent.Last(TVN_BEGINDRAGW)) << m_parent.Trace();
+    EXPECT_FALSE(Traced("click")) << m_trace;
+    EXPECT_FALSE(Traced("drag")) << m_trace;
 
     Arrange("B D", "B");
-    m_parent.PostMessage(CRecordingParent::kCaptureMessage, reinterpret_cast<WPARAM>(other.m_hWnd));
+    m_parent.PostMessage(CTestParent::kCaptureMessage, reinterpret_cast<WPARAM>(other.m_hWnd));
     SendButtonDown(RightOfLabel("A"), MK_LBUTTON | MK_CONTROL);
     EXPECT_EQ(other.m_hWnd, ::GetCapture());
     ::ReleaseCapture();
@@ -300,13 +272,13 @@ TEST_F(MouseTest, QuitDuringAPressIsKeptForTheApplication)
     for (const char* at : { "C", ">B" })
     {
         SCOPED_TRACE(at);
-        m_parent.ClearTrace();
+        m_trace.clear();
         PointCursorAt(At(at));
         ::PostQuitMessage(3);
         SendButtonDown(At(at));
         EXPECT_EQ(nullptr, ::GetCapture());
         if (at[0] != '>')
-            EXPECT_EQ(nullptr, m_parent.Last(NM_CLICK)) << m_parent.Trace();
+            EXPECT_FALSE(Traced("click")) << m_trace;
         MSG msg;
         ASSERT_TRUE(::PeekMessage(&msg, NULL, WM_QUIT, WM_QUIT, PM_REMOVE));
         EXPECT_EQ(3u, msg.wParam);

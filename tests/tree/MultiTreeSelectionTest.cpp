@@ -10,8 +10,6 @@
 // - run-time classes.
 #include "TreeHarness.h"
 
-#include "Input.h"
-
 using namespace tree_test;
 using orvane_test::KeyStateGuard;
 using orvane_test::SendKey;
@@ -62,15 +60,7 @@ const StateCase kStateCases[] = {
       "A B", "", S, nullptr },
 };
 
-class SelectionTest : public TreeFixture
-{
-protected:
-    void SetUp() override
-    {
-        TreeFixture::SetUp();
-        Build(kSmallTree);
-    }
-};
+using SelectionTest = SmallTreeFixture;
 
 TEST_F(SelectionTest, SetItemStateRequests)
 {
@@ -82,7 +72,7 @@ TEST_F(SelectionTest, SetItemStateRequests)
         m_parent.m_hVeto = Item(c.veto);
         EXPECT_EQ(c.result, m_tree.SetItemState(Item(c.item), c.state, c.mask));
         if (c.trace != nullptr)
-            EXPECT_EQ(c.trace, m_parent.Trace());
+            EXPECT_EQ(c.trace, m_trace);
         EXPECT_EQ(c.selected, Selected());
         EXPECT_EQ(c.caretAfter, Caret());
         EXPECT_EQ(c.itemState, m_tree.GetItemState(Item(c.item), F | S | BOLD));
@@ -95,11 +85,12 @@ TEST_F(SelectionTest, SetItemStateRequests)
 TEST_F(SelectionTest, TheEmulatedPairCarriesHandleAndItemData)
 {
     Arrange("A", "A");
+    orvane_test::NotifySpy changed(m_parent, TVN_SELCHANGEDW, sizeof(NMTREEVIEW));
     m_tree.SetItemState(Item("C"), S, S);
-    const CRecordingParent::Record* changed = m_parent.Last(TVN_SELCHANGEDW);
-    ASSERT_NE(nullptr, changed);
-    EXPECT_EQ(UINT(TVIF_HANDLE | TVIF_PARAM), changed->newMask);
-    EXPECT_EQ(LPARAM(m_tree.GetItemData(Item("C"))), changed->newParam);
+    ASSERT_EQ(1, changed.count());
+    const NMTREEVIEW& nm = *reinterpret_cast<const NMTREEVIEW*>(changed.payloads()[0].data());
+    EXPECT_EQ(UINT(TVIF_HANDLE | TVIF_PARAM), nm.itemNew.mask);
+    EXPECT_EQ(LPARAM(m_tree.GetItemData(Item("C"))), nm.itemNew.lParam);
     EXPECT_FALSE(m_tree.SetItemState(NULL, S, S));
 }
 
@@ -138,7 +129,7 @@ TEST_F(SelectionTest, SelectedWalksFollowVisibleOrderSelectAllTouchesOnlyItemsTh
     Arrange("B D", "B");
     m_tree.SelectAll(FALSE);
     EXPECT_EQ("", Selected());
-    EXPECT_EQ("*ing:-B *ed:-B *ing:-D *ed:-D", m_parent.Trace());
+    EXPECT_EQ("*ing:-B *ed:-B *ing:-D *ed:-D", m_trace);
     m_tree.SelectAll(TRUE);
     EXPECT_EQ("A A1 A2 A2a B C C1 D E", Selected());
 }
@@ -268,8 +259,8 @@ TEST_F(SelectionTest, CollapseDeselectsDescendantsAndRemovesTheCaretInside)
         EXPECT_EQ(0u, m_tree.GetItemState(Item("A"), TVIS_EXPANDED));
         EXPECT_EQ(c.selected, Selected());
         EXPECT_EQ(c.caretAfter, Caret());
-        EXPECT_NE(std::string::npos, m_parent.Trace().find("expanding:+A")) << m_parent.Trace();
-        EXPECT_NE(std::string::npos, m_parent.Trace().find(c.trace)) << m_parent.Trace();
+        EXPECT_NE(std::string::npos, m_trace.find("expanding:+A")) << m_trace;
+        EXPECT_NE(std::string::npos, m_trace.find(c.trace)) << m_trace;
     }
 }
 
@@ -281,7 +272,7 @@ TEST_F(SelectionTest, SwitchingOffKeepsOnlyASelectedCaret)
     EXPECT_TRUE(m_tree.SetMultiSelect(FALSE));
     EXPECT_FALSE(m_tree.IsMultiSelect());
     EXPECT_EQ("B", Selected());
-    EXPECT_EQ(std::string::npos, m_parent.Trace().find('*')) << m_parent.Trace();
+    EXPECT_EQ(std::string::npos, m_trace.find('*')) << m_trace;
     EXPECT_EQ("-A -D", m_tree.m_hookTrace);
     EXPECT_FALSE(m_tree.SetMultiSelect(TRUE));
     Arrange("A C D", "B");
@@ -294,10 +285,10 @@ TEST_F(SelectionTest, SingleModeBehavesAsAPlainTree)
 {
     Arrange("A2a", "A2a");
     m_tree.SetMultiSelect(FALSE);
-    m_parent.ClearTrace();
+    m_trace.clear();
     m_tree.m_hookTrace.clear();
     EXPECT_TRUE(m_tree.SetItemState(Item("C"), S, S));
-    EXPECT_EQ("", m_parent.Trace());
+    EXPECT_EQ("", m_trace);
     EXPECT_EQ("+C", m_tree.m_hookTrace);
     m_tree.CTreeCtrl::SetItemState(Item("C"), 0, S);
     {
@@ -305,7 +296,7 @@ TEST_F(SelectionTest, SingleModeBehavesAsAPlainTree)
         SendKey(m_tree, VK_DOWN);
     }
     EXPECT_EQ("B", Selected());
-    EXPECT_EQ("ing:-A2a+B ed:-A2a+B", m_parent.Trace());
+    EXPECT_EQ("ing:-A2a+B ed:-A2a+B", m_trace);
     m_tree.CTreeCtrl::SelectItem(Item("A1"));
     Click(PointWithHit("A", TVHT_ONITEMBUTTON));
     EXPECT_EQ("A", Caret());   // the plain tree moves a hidden caret to the collapsed parent

@@ -1,6 +1,7 @@
-// Test harness of the tree family: a parent window that records the notifications it
-// receives (with IsEmulatedNotify at that moment) as a compact trace, a tree that exposes
-// the protected operations, and a fixture that builds named items and drives presses.
+// Test harness of the tree family: a parent window that vetoes and answers probes, the
+// notifications it receives recorded by a MsgLog (with IsEmulatedNotify at that moment) as
+// a compact trace, a tree that exposes the protected operations, and a fixture that builds
+// named items and drives presses.
 //
 // Trace of one notification: [*]code[:-old][+new]
 //   *    sent by the control itself (IsEmulatedNotify was TRUE during the call)
@@ -14,9 +15,12 @@
 #include <gtest/gtest.h>
 
 #include "CMultiTree.h"
+#include "CallLater.h"
 #include "Input.h"
+#include "MsgSequence.h"
 #include "OrvaneLibrary.h"
 
+#include <functional>
 #include <map>
 #include <sstream>
 #include <string>
@@ -59,51 +63,88 @@ public:
     }
 };
 
-class CRecordingParent : public CWnd
+// Refuses TVN_SELCHANGINGW naming m_hVeto. A posted kProbeMessage records the selection
+// when a press loop dispatches it: the state between the press and the release. A posted
+// kCaptureMessage gives the mouse capture to the window in wParam.
+class CTestParent : public CWnd
 {
 public:
-    struct Record
-    {
-        UINT code;
-        bool emulated;
-        std::string oldName, newName;
-        UINT newMask;
-        LPARAM newParam;
-        POINT ptDrag;
-    };
-
-    std::string Trace() const
-    {
-        std::string trace;
-        for (const Record& r : m_records)
-        {
-            trace += (trace.empty() ? "" : " ") + std::string(r.emulated ? "*" : "") + CodeName(r.code);
-            if (!r.oldName.empty() || !r.newName.empty())
-                trace += ":" + (r.oldName.empty() ? "" : "-" + r.oldName) + (r.newName.empty() ? "" : "+" + r.newName);
-        }
-        return trace;
-    }
-    void ClearTrace() { m_records.clear(); }
-    const Record* Last(UINT code) const
-    {
-        for (auto it = m_records.rbegin(); it != m_records.rend(); ++it)
-            if (it->code == code)
-                return &*it;
-        return nullptr;
-    }
-
-    CTestTree* m_pTree = nullptr;
-    HTREEITEM m_hVeto = NULL;                       // TVN_SELCHANGINGW naming this item is refused
-    std::vector<std::string> m_selectionAtClick;    // the selection at each NM_CLICK
-    // A posted kProbeMessage records the selection when a press loop dispatches it: the
-    // state between the press and the release. A posted kCaptureMessage gives the mouse
-    // capture to the window in wParam.
     static constexpr UINT kProbeMessage = WM_APP + 7;
     static constexpr UINT kCaptureMessage = WM_APP + 8;
+    CTestTree* m_pTree = nullptr;
+    HTREEITEM m_hVeto = NULL;
     std::vector<std::string> m_probes;
     void PostProbe() { PostMessage(kProbeMessage); }
 
 protected:
+    BOOL OnNotify(WPARAM wParam, LPARAM lParam, LRESULT* pResult) override
+    {
+        const NMTREEVIEW* pNM = reinterpret_cast<const NMTREEVIEW*>(lParam);
+        if (pNM->hdr.code == TVN_SELCHANGINGW && m_hVeto != NULL
+            && (pNM->itemNew.hItem == m_hVeto || pNM->itemOld.hItem == m_hVeto))
+        {
+            *pResult = TRUE;
+            return TRUE;
+        }
+        // The framework reflects the notification to the tree first (collapse handling).
+        return CWnd::OnNotify(wParam, lParam, pResult);
+    }
+    LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override
+    {
+        if (message == kProbeMessage)
+            m_probes.push_back(m_pTree != nullptr ? SelectedNames(*m_pTree) : std::string());
+        else if (message == kCaptureMessage)
+            ::SetCapture(reinterpret_cast<HWND>(wParam));
+        else
+            return CWnd::WindowProc(message, wParam, lParam);
+        return 0;
+    }
+};
+
+class TreeFixture : public testing::Test
+{
+protected:
+    static constexpr DWORD kBaseStyle = WS_CHILD | WS_VISIBLE | WS_BORDER | TVS_HASBUTTONS | TVS_HASLINES
+        | TVS_LINESATROOT | TVS_SHOWSELALWAYS;
+
+    static void SetUpTestSuite() { orvane_test::LoadLibraryOnce(); }
+    void SetUp() override
+    {
+        m_log.onRecord = [this](int, const orvane_test::MsgEntry& e) { Record(e); };
+        ASSERT_TRUE(CreateParent());
+        m_parent.m_pTree = &m_tree;
+        CreateTree();
+    }
+    // The tree's top-level parent window (again, after a test destroyed it).
+    bool CreateParent()
+    {
+        if (!m_parent.CreateEx(0, AfxRegisterWndClass(0, ::LoadCursor(NULL, IDC_ARROW), HBRUSH(COLOR_WINDOW + 1)),
+                               _T("tree test"), WS_POPUP | WS_VISIBLE | WS_CLIPCHILDREN, 60, 60, 320, 420, NULL, NULL))
+            return false;
+        m_log.SpyParent(m_parent, 0);
+        return true;
+    }
+    // Appends a notification of the tree to the trace while it is being sent.
+    void Record(const orvane_test::MsgEntry& e)
+    {
+        const NMTREEVIEW* pNM = reinterpret_cast<const NMTREEVIEW*>(e.lParam);
+        const bool fromTree = e.message == WM_NOTIFY && pNM->hdr.hwndFrom == m_tree.m_hWnd;
+        const char* code = fromTree ? CodeName(pNM->hdr.code) : nullptr;
+        m_log.Flush();
+        if (code == nullptr)
+            return;
+        std::string entry = (m_tree.IsEmulatedNotify() ? "*" : "") + std::string(code);
+        if (pNM->hdr.code == NM_CLICK || pNM->hdr.code == NM_RCLICK)
+            m_selectionAtClick.push_back(Selected());
+        else
+        {
+            const std::string oldName = ItemName(m_tree, pNM->itemOld.hItem);
+            const std::string newName = ItemName(m_tree, pNM->itemNew.hItem);
+            if (!oldName.empty() || !newName.empty())
+                entry += ":" + (oldName.empty() ? "" : "-" + oldName) + (newName.empty() ? "" : "+" + newName);
+        }
+        m_trace += (m_trace.empty() ? "" : " ") + entry;
+    }
     static const char* CodeName(UINT code)
     {
         switch (code)
@@ -119,95 +160,14 @@ protected:
         default: return nullptr;
         }
     }
-    BOOL OnNotify(WPARAM wParam, LPARAM lParam, LRESULT* pResult) override
+    // Whether the trace holds a notification of this code ("click", "drag"...).
+    bool Traced(const std::string& code) const
     {
-        const NMHDR* pHdr = reinterpret_cast<const NMHDR*>(lParam);
-        if (m_pTree != nullptr && pHdr->hwndFrom == m_pTree->m_hWnd && CodeName(pHdr->code) != nullptr)
-        {
-            Record r = { pHdr->code, m_pTree->IsEmulatedNotify() != FALSE };
-            if (pHdr->code != NM_CLICK && pHdr->code != NM_RCLICK)
-            {
-                const NMTREEVIEW* pNM = reinterpret_cast<const NMTREEVIEW*>(lParam);
-                r.oldName = ItemName(*m_pTree, pNM->itemOld.hItem);
-                r.newName = ItemName(*m_pTree, pNM->itemNew.hItem);
-                r.newMask = pNM->itemNew.mask;
-                r.newParam = pNM->itemNew.lParam;
-                r.ptDrag = pNM->ptDrag;
-                if (pHdr->code == TVN_SELCHANGINGW && m_hVeto != NULL
-                    && (pNM->itemNew.hItem == m_hVeto || pNM->itemOld.hItem == m_hVeto))
-                {
-                    m_records.push_back(r);
-                    *pResult = TRUE;
-                    return TRUE;
-                }
-            }
-            else
-                m_selectionAtClick.push_back(SelectedNames(*m_pTree));
-            m_records.push_back(r);
-        }
-        // The framework reflects the notification to the tree first (collapse handling).
-        return CWnd::OnNotify(wParam, lParam, pResult);
-    }
-    LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override
-    {
-        if (message == kProbeMessage)
-            m_probes.push_back(m_pTree != nullptr ? SelectedNames(*m_pTree) : std::string());
-        else if (message == kCaptureMessage)
-            ::SetCapture(reinterpret_cast<HWND>(wParam));
-        else
-            return CWnd::WindowProc(message, wParam, lParam);
-        return 0;
-    }
-
-private:
-    std::vector<Record> m_records;
-};
-
-// Bounds a press: the press loops end when the control loses the capture, so a loop still
-// running after five seconds has the capture taken away, and the test fails.
-class PressWatchdog
-{
-public:
-    PressWatchdog() : m_timer(::SetTimer(NULL, 0, 5000, &Expired)) { Fired() = false; }
-    ~PressWatchdog()
-    {
-        ::KillTimer(NULL, m_timer);
-        EXPECT_FALSE(Fired()) << "a press loop did not end by itself";
-    }
-
-private:
-    static bool& Fired()
-    {
-        static bool fired = false;
-        return fired;
-    }
-    static void CALLBACK Expired(HWND, UINT, UINT_PTR id, DWORD)
-    {
-        ::KillTimer(NULL, id);
-        Fired() = true;
-        ::ReleaseCapture();
-    }
-    UINT_PTR m_timer;
-};
-
-class TreeFixture : public testing::Test
-{
-protected:
-    static constexpr DWORD kBaseStyle = WS_CHILD | WS_VISIBLE | WS_BORDER | TVS_HASBUTTONS | TVS_HASLINES
-        | TVS_LINESATROOT | TVS_SHOWSELALWAYS;
-
-    static void SetUpTestSuite() { orvane_test::LoadLibraryOnce(); }
-    void SetUp() override
-    {
-        ASSERT_TRUE(CreateParent());
-        m_parent.m_pTree = &m_tree;
-        CreateTree();
-    }
-    // The tree's top-level parent window (again, after a test destroyed it).
-    bool CreateParent()
-    {
-        return m_parent.CreateEx(0, AfxRegisterWndClass(0, ::LoadCursor(NULL, IDC_ARROW), HBRUSH(COLOR_WINDOW + 1)),
-                                 _T("tree test"), WS_POPUP | WS_VISIBLE | WS_CLIPCHILDREN, 60, 60, 320, 420, NULL, NULL) != FALSE;
+        std::istringstream words(m_trace);
+        for (std::string w; words >> w;)
+            if (w.substr(w[0] == '*' ? 1 : 0, w.find(':') - (w[0] == '*' ? 1 : 0)) == code)
+                return true;
+        return false;
     }
     void TearDown() override
     {
@@ -249,7 +209,7 @@ protected:
                 m_tree.Expand(entry.second, TVE_EXPAND);
         m_tree.SetRedraw(TRUE);
         m_tree.UpdateWindow();
-        m_parent.ClearTrace();
+        m_trace.clear();
     }
     // count flat items "I0".."I<count-1>".
     void BuildFlat(int count)
@@ -280,8 +240,8 @@ protected:
         }
         m_tree.SetAnchor(NULL);
         m_tree.UpdateWindow();
-        m_parent.ClearTrace();
-        m_parent.m_selectionAtClick.clear();
+        m_trace.clear();
+        m_selectionAtClick.clear();
         m_parent.m_probes.clear();
         m_tree.m_hookTrace.clear();
     }
@@ -324,11 +284,19 @@ protected:
     {
         m_tree.PostMessage(message, keys, MAKELPARAM(pt.x, pt.y));
     }
+    // Runs a press. The press loops end when the control loses the capture, so a loop still
+    // running after five seconds has the capture taken away, and the test fails.
+    void Bounded(const std::function<void()>& press)
+    {
+        orvane_test::CallLater watchdog(5000, [] { ::ReleaseCapture(); });
+        press();
+        EXPECT_FALSE(watchdog.fired()) << "a press loop did not end by itself";
+    }
     void SendButtonDown(CPoint pt, UINT keys = MK_LBUTTON)
     {
-        PressWatchdog watchdog;
-        m_tree.SendMessage(WM_LBUTTONDOWN, keys, MAKELPARAM(pt.x, pt.y));
+        Bounded([&] { m_tree.SendMessage(WM_LBUTTONDOWN, keys, MAKELPARAM(pt.x, pt.y)); });
     }
+    void RightPress(CPoint pt, UINT keys = MK_RBUTTON) { Bounded([&] { m_tree.OnButtonDown(FALSE, keys, pt); }); }
     // A click: the button-up queued, then the button-down sent.
     void Click(CPoint pt, UINT keys = 0)
     {
@@ -338,9 +306,23 @@ protected:
         orvane_test::PumpUntilIdle(50);
     }
 
-    CRecordingParent m_parent;
+    CTestParent m_parent;
     CTestTree m_tree;
     std::map<std::string, HTREEITEM> m_items;
+    orvane_test::MsgLog m_log{ 1 };
+    std::string m_trace;
+    std::vector<std::string> m_selectionAtClick;   // the selection at each NM_CLICK
+};
+
+// The fixture with kSmallTree built.
+class SmallTreeFixture : public TreeFixture
+{
+protected:
+    void SetUp() override
+    {
+        TreeFixture::SetUp();
+        Build(kSmallTree);
+    }
 };
 
 } // namespace tree_test

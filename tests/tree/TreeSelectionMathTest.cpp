@@ -176,33 +176,30 @@ TEST(PreSelection, ByButtonAndKeys)
 
 TEST(PlanClick, ByButtonKeysAndState)
 {
-    ClickSelection plain = PlanClick(true, 0, true);
-    EXPECT_TRUE(plain.apply);
-    EXPECT_TRUE(plain.deselectOthers);
-    EXPECT_EQ(kSelected, plain.selectedBit);
-
-    ClickSelection toggleOff = PlanClick(true, MK_CONTROL, true);
-    EXPECT_TRUE(toggleOff.apply);
-    EXPECT_FALSE(toggleOff.deselectOthers);
-    EXPECT_EQ(0u, toggleOff.selectedBit);
-
-    ClickSelection toggleOn = PlanClick(true, MK_CONTROL, false);
-    EXPECT_EQ(kSelected, toggleOn.selectedBit);
-
-    EXPECT_FALSE(PlanClick(true, MK_SHIFT, false).apply);
-    EXPECT_FALSE(PlanClick(true, MK_SHIFT | MK_CONTROL, false).apply);
-    EXPECT_FALSE(PlanClick(false, 0, false).apply);
-    EXPECT_FALSE(PlanClick(false, MK_CONTROL, false).apply);
+    // The plan as letters: A applied, D others deselected, S selected bit; "-" not applied.
+    const struct { bool left; UINT keys; bool itemSelected; const char* plan; } cases[] = {
+        { true, 0, true, "ADS" },       { true, MK_CONTROL, true, "A" },  { true, MK_CONTROL, false, "AS" },
+        { true, MK_SHIFT, false, "-" }, { true, MK_SHIFT | MK_CONTROL, false, "-" },
+        { false, 0, false, "-" },       { false, MK_CONTROL, false, "-" },
+    };
+    for (const auto& c : cases)
+    {
+        const ClickSelection p = PlanClick(c.left, c.keys, c.itemSelected);
+        std::string plan = p.apply ? "A" : "-";
+        if (p.apply)
+            plan += std::string(p.deselectOthers ? "D" : "") + (p.selectedBit == kSelected ? "S" : "");
+        EXPECT_EQ(c.plan, plan) << c.left << " keys " << c.keys << " selected " << c.itemSelected;
+    }
 }
 
 TEST(DragDistance, StrictlyBeyondOnEitherAxis)
 {
-    const POINT from = { 100, 50 };
-    EXPECT_FALSE(ExceedsDragDistance(from, POINT{ 104, 54 }, 4, 4));
-    EXPECT_FALSE(ExceedsDragDistance(from, POINT{ 96, 46 }, 4, 4));
-    EXPECT_TRUE(ExceedsDragDistance(from, POINT{ 105, 50 }, 4, 4));
-    EXPECT_TRUE(ExceedsDragDistance(from, POINT{ 100, 45 }, 4, 4));
-    EXPECT_TRUE(ExceedsDragDistance(from, POINT{ -30000, 50 }, 4, 4));
+    const struct { POINT to; bool beyond; } cases[] = {
+        { { 104, 54 }, false }, { { 96, 46 }, false }, { { 105, 50 }, true }, { { 100, 45 }, true },
+        { { -30000, 50 }, true },
+    };
+    for (const auto& c : cases)
+        EXPECT_EQ(c.beyond, ExceedsDragDistance(POINT{ 100, 50 }, c.to, 4, 4)) << c.to.x << "," << c.to.y;
 }
 
 // ---------------------------------------------------------------------------------
@@ -261,19 +258,16 @@ TEST(BandTouches, Touches)
 
 TEST(AutoScroll, OneLinePerAxisOutsideTheClientArea)
 {
-    const RECT client = { 0, 0, 200, 100 };
-    AutoScroll in = AutoScrollFor(POINT{ 0, 0 }, client);
-    EXPECT_EQ(0, in.vertical);
-    EXPECT_EQ(0, in.horizontal);
-    AutoScroll below = AutoScrollFor(POINT{ 50, 100 }, client);   // the bottom edge is outside
-    EXPECT_EQ(1, below.vertical);
-    EXPECT_EQ(0, below.horizontal);
-    AutoScroll aboveLeft = AutoScrollFor(POINT{ -1, -1 }, client);
-    EXPECT_EQ(-1, aboveLeft.vertical);
-    EXPECT_EQ(-1, aboveLeft.horizontal);
-    AutoScroll right = AutoScrollFor(POINT{ 200, 99 }, client);
-    EXPECT_EQ(0, right.vertical);
-    EXPECT_EQ(1, right.horizontal);
+    // The client area is (0, 0, 200, 100); its bottom and right edges are outside.
+    const struct { POINT pt; int vertical, horizontal; } cases[] = {
+        { { 0, 0 }, 0, 0 }, { { 50, 100 }, 1, 0 }, { { -1, -1 }, -1, -1 }, { { 200, 99 }, 0, 1 },
+    };
+    for (const auto& c : cases)
+    {
+        const AutoScroll scroll = AutoScrollFor(c.pt, RECT{ 0, 0, 200, 100 });
+        EXPECT_EQ(c.vertical, scroll.vertical) << c.pt.x << "," << c.pt.y;
+        EXPECT_EQ(c.horizontal, scroll.horizontal) << c.pt.x << "," << c.pt.y;
+    }
 }
 
 // ---------------------------------------------------------------------------------

@@ -4,9 +4,6 @@
 // free, sends nothing more about the dead tree, and a new tree works as before.
 #include "TreeHarness.h"
 
-#include "CallLater.h"
-#include "Input.h"
-
 using namespace tree_test;
 using orvane_test::CallLater;
 
@@ -26,17 +23,16 @@ const DeathCase kDeaths[] = {
     { "BandTopLevelDestroyed", true, true },
 };
 
-class LoopDeathTest : public TreeFixture, public testing::WithParamInterface<DeathCase> {};
+class LoopDeathTest : public SmallTreeFixture, public testing::WithParamInterface<DeathCase> {};
 
 TEST_P(LoopDeathTest, LoopEndsAtOnceAndANewTreeWorks)
 {
     const DeathCase& c = GetParam();
-    Build(kSmallTree);
     const CPoint press = c.band ? RightOfLabel("B") : LabelPoint("B");
     PointCursorAt(press);
     CallLater kill(30, [&] {
         c.topLevel ? m_parent.DestroyWindow() : m_tree.DestroyWindow();
-        m_parent.ClearTrace();
+        m_trace.clear();
         m_tree.m_hookTrace.clear();
     });
     CallLater release(1500, [] { ::PostMessageW(NULL, WM_LBUTTONUP, 0, 0); });
@@ -45,7 +41,7 @@ TEST_P(LoopDeathTest, LoopEndsAtOnceAndANewTreeWorks)
     EXPECT_FALSE(release.fired()) << "the loop ran on after its window was gone";
     EXPECT_EQ(nullptr, ::GetCapture());
     orvane_test::PumpUntilIdle(50);
-    EXPECT_EQ("", m_parent.Trace());
+    EXPECT_EQ("", m_trace);
     EXPECT_EQ("", m_tree.m_hookTrace);
 
     ASSERT_TRUE(!c.topLevel || CreateParent());
@@ -66,7 +62,7 @@ TEST_P(LoopDeathTest, LoopEndsAtOnceAndANewTreeWorks)
         Click(LabelPoint("D"));
         EXPECT_EQ("D", Selected());
     }
-    EXPECT_NE(std::string::npos, m_parent.Trace().find("*click")) << m_parent.Trace();
+    EXPECT_NE(std::string::npos, m_trace.find("*click")) << m_trace;
 }
 
 INSTANTIATE_TEST_SUITE_P(Tree, LoopDeathTest, testing::ValuesIn(kDeaths),
