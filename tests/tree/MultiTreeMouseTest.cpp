@@ -50,10 +50,10 @@ protected:
     }
     // Item names: that item's row at the press's x; "dx,dy": offsets from the press, where
     // 'd' stands for the system's drag distance ("d+1,0" is one pixel beyond it); "esc".
-    std::vector<CPoint> Moves(const std::string& spec, CPoint press) const
+    std::vector<CPoint> Moves(const std::string& path, CPoint press) const
     {
         std::vector<CPoint> moves;
-        std::istringstream words(spec);
+        std::istringstream words(path);
         for (std::string w; words >> w;)
         {
             const size_t comma = w.find(',');

@@ -183,10 +183,10 @@ TEST_F(SelectionTest, SelectChildrenRecursesIntoExpandedBranchesAndReportsTheCar
     // Depth first with a stack of its own: each level is one nested branch.
     CreateTree();
     m_tree.ShowWindow(SW_HIDE);
-    std::string spec;
+    std::string outline;
     for (int i = 0; i < 300; ++i)
-        spec += std::string(static_cast<size_t>(i), ' ') + "L" + std::to_string(i) + "\n";
-    Build(spec.c_str());
+        outline += std::string(static_cast<size_t>(i), ' ') + "L" + std::to_string(i) + "\n";
+    Build(outline.c_str());
     EXPECT_FALSE(m_tree.SelectChildren(Item("L0"), TRUE, TRUE));
     EXPECT_EQ(299u, m_tree.GetSelectedCount());
     EXPECT_EQ(1, m_tree.IsSelected(Item("L299")));

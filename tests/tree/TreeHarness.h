@@ -188,10 +188,10 @@ protected:
         ASSERT_TRUE(m_tree.Create(kBaseStyle | extraStyle, rc, &m_parent, 1234));
     }
     // One item per line, one leading blank per level, item data from 100; every parent expanded.
-    void Build(const char* spec)
+    void Build(const char* outline)
     {
         std::vector<HTREEITEM> parents;   // parents[level]: the last item at that level
-        std::istringstream lines(spec);
+        std::istringstream lines(outline);
         LPARAM data = 100;
         m_tree.SetRedraw(FALSE);
         for (std::string line; std::getline(lines, line);)
@@ -214,10 +214,10 @@ protected:
     // count flat items "I0".."I<count-1>".
     void BuildFlat(int count)
     {
-        std::string spec;
+        std::string outline;
         for (int i = 0; i < count; ++i)
-            spec += "I" + std::to_string(i) + "\n";
-        Build(spec.c_str());
+            outline += "I" + std::to_string(i) + "\n";
+        Build(outline.c_str());
     }
 
     HTREEITEM Item(const std::string& name) const
