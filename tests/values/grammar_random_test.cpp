@@ -7,6 +7,7 @@
 //    ("" or "1") can make the text a number, and the value comes from the C runtime.
 #include <gtest/gtest.h>
 
+#include <cctype>
 #include <cerrno>
 #include <cmath>
 #include <cstdint>
@@ -99,37 +100,18 @@ Reference ReferenceLong(const std::wstring& text)
     bool negative = core[0] == L'-';
     bool sign = core[0] == L'-' || core[0] == L'+';
     std::string digits = Narrow(core.substr(sign ? 1 : 0));
-    int base = 10;
-    if (digits.size() > 1 && digits[0] == '0' && (digits[1] == 'b' || digits[1] == 'B'))
-        base = 2;
-    if (digits.size() > 1 && digits[0] == '0' && (digits[1] == 'x' || digits[1] == 'X'))
-        base = 16;
+    const char prefix = digits.size() > 1 && digits[0] == '0' ? char(std::tolower(digits[1])) : '\0';
+    const int base = prefix == 'b' ? 2 : prefix == 'x' ? 16 : 10;
     if (base != 10)
         digits = digits.substr(2);
     errno = 0;
     unsigned long long magnitude = std::strtoull(digits.c_str(), nullptr, base);
-    bool huge = errno == ERANGE;
-    if (base != 10 && !sign)
-    {
-        if (huge || magnitude > 0xFFFFFFFFull)
-            ref.code = KVT_CONVERT_OVERFLOW;
-        else
-            ref.longValue = long(int32_t(uint32_t(magnitude)));
-    }
-    else if (negative)
-    {
-        if (huge || magnitude > 2147483648ull)
-            ref.code = KVT_CONVERT_UNDERFLOW;
-        else
-            ref.longValue = long(-int64_t(magnitude));
-    }
+    // Unsigned prefixed text is a 32-bit pattern; otherwise the magnitude of a signed value.
+    const unsigned long long limit = base != 10 && !sign ? 0xFFFFFFFFull : negative ? 2147483648ull : 2147483647ull;
+    if (errno == ERANGE || magnitude > limit)
+        ref.code = negative ? KVT_CONVERT_UNDERFLOW : KVT_CONVERT_OVERFLOW;
     else
-    {
-        if (huge || magnitude > 2147483647ull)
-            ref.code = KVT_CONVERT_OVERFLOW;
-        else
-            ref.longValue = long(magnitude);
-    }
+        ref.longValue = long(int32_t(uint32_t(negative ? 0 - magnitude : magnitude)));
     return ref;
 }
 
