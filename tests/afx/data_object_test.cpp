@@ -7,6 +7,9 @@
 // - auto-deleting vs. the pre-allocated memory exception; error messages
 #include <gtest/gtest.h>
 #include <afx.h>
+
+#include "AfxTestHelpers.h"
+
 #include <functional>
 #include <string>
 
@@ -211,15 +214,9 @@ TEST(Exceptions, FileExceptionCausesFromOsErrors)
     };
     for (const auto& c : cases)
         EXPECT_EQ(c.cause, CFileException::OsErrorToException(c.error)) << "error " << c.error;
-    try
-    {
-        CFileException::ThrowOsError(ERROR_TOO_MANY_OPEN_FILES, L"f.txt");
-        ADD_FAILURE() << "nothing thrown";
-    }
-    catch (CFileException* e)
-    {
-        EXPECT_EQ(CFileException::tooManyOpenFiles, e->m_cause);
-        EXPECT_EQ(std::wstring(L"f.txt"), std::wstring((LPCTSTR)e->m_strFileName));
-        e->Delete();
-    }
+    EXPECT_TRUE(afx_test::Throws<CFileException>([] { CFileException::ThrowOsError(ERROR_TOO_MANY_OPEN_FILES, L"f.txt"); },
+        [](CFileException* e) {
+            EXPECT_EQ(CFileException::tooManyOpenFiles, e->m_cause);
+            EXPECT_EQ(L"f.txt", afx_test::W(e->m_strFileName));
+        }));
 }
