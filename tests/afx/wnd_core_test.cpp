@@ -176,30 +176,30 @@ TEST(WndCreate, PreCreateWindowChangesTheStyle)
     wnd.DestroyWindow();
 }
 
-TEST(WndCreate, FailingOnCreateFailsCreateAndCleansUpOnce)
-{
-    CCreateWnd wnd;
-    wnd.m_nCreateResult = -1;
-    EXPECT_FALSE(wnd.CreateEx(0, NULL, L"fails", WS_POPUP, PopupRect(), NULL, 0));
-    EXPECT_EQ(NULL, wnd.m_hWnd);
-    EXPECT_EQ(1, wnd.m_nPostNcDestroy);
-    ASSERT_GE(wnd.m_seen.size(), 2u);
-    EXPECT_EQ((UINT)WM_CREATE, wnd.m_seen[1]);
-}
+// A creation that fails in OnCreate or for want of a class: no window, PostNcDestroy
+// once, and the hook not left armed (the next plain window is not captured).
+const struct { const char* name; LPCTSTR pszClass; int nCreateResult; std::vector<UINT> seen; } kFailedCreations[] = {
+    { "OnCreate fails", NULL, -1, { WM_NCCREATE, WM_CREATE } },
+    { "unknown class", L"NoSuchClass_Orvane", 0, {} },
+};
 
-TEST(WndCreate, UnknownClassFailsWithoutLeavingTheHookArmed)
+TEST(WndCreate, FailedCreationCleansUpOnceAndDisarmsTheHook)
 {
-    CCreateWnd wnd;
-    EXPECT_FALSE(wnd.CreateEx(0, L"NoSuchClass_Orvane", L"x", WS_POPUP, PopupRect(), NULL, 0));
-    EXPECT_EQ(NULL, wnd.m_hWnd);
-    EXPECT_EQ(1, wnd.m_nPostNcDestroy);
-
-    // The next plain window is not captured by the failed object.
-    HWND hPlain = ::CreateWindowExW(0, L"STATIC", L"plain", WS_POPUP, 0, 0, 10, 10, NULL, NULL, NULL, NULL);
-    ASSERT_NE(nullptr, hPlain);
-    EXPECT_EQ(nullptr, CWnd::FromHandlePermanent(hPlain));
-    EXPECT_EQ(NULL, wnd.m_hWnd);
-    ::DestroyWindow(hPlain);
+    for (const auto& c : kFailedCreations)
+    {
+        SCOPED_TRACE(c.name);
+        CCreateWnd wnd;
+        wnd.m_nCreateResult = c.nCreateResult;
+        EXPECT_FALSE(wnd.CreateEx(0, c.pszClass, L"fails", WS_POPUP, PopupRect(), NULL, 0));
+        EXPECT_EQ(NULL, wnd.m_hWnd);
+        EXPECT_EQ(1, wnd.m_nPostNcDestroy);
+        EXPECT_EQ(c.seen, wnd.m_seen);
+        HWND hPlain = ::CreateWindowExW(0, L"STATIC", L"plain", WS_POPUP, 0, 0, 10, 10, NULL, NULL, NULL, NULL);
+        ASSERT_NE(nullptr, hPlain);
+        EXPECT_EQ(nullptr, CWnd::FromHandlePermanent(hPlain));
+        EXPECT_EQ(NULL, wnd.m_hWnd);
+        ::DestroyWindow(hPlain);
+    }
 }
 
 TEST(WndCreate, SecondCreateOnTheSameObjectFails)
