@@ -12,7 +12,7 @@
 
 #include <gtest/gtest.h>
 
-#include "AfxTestHelpers.h"
+#include "AfxTestSupport.h"
 #include "Input.h"
 
 #include <string>

@@ -11,7 +11,7 @@
 #include <gtest/gtest.h>
 #include <afxtempl.h>
 
-#include "AfxTestHelpers.h"
+#include "AfxTestSupport.h"
 
 #include <functional>
 #include <map>

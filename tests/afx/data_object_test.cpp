@@ -8,7 +8,7 @@
 #include <gtest/gtest.h>
 #include <afxwin.h>
 
-#include "AfxTestHelpers.h"
+#include "AfxTestSupport.h"
 
 #include <functional>
 #include <string>

@@ -9,7 +9,7 @@
 #include <gtest/gtest.h>
 #include <afx.h>
 
-#include "AfxTestHelpers.h"
+#include "AfxTestSupport.h"
 
 #include <string>
 

@@ -7,7 +7,7 @@
 #include <afx.h>
 #include <atltypes.h>
 
-#include "AfxTestHelpers.h"
+#include "AfxTestSupport.h"
 
 #include <string>
 

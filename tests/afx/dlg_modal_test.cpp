@@ -14,7 +14,7 @@
 
 #include <gtest/gtest.h>
 
-#include "AfxTestHelpers.h"
+#include "AfxTestSupport.h"
 #include "Input.h"
 #include "DialogTemplate.h"
 

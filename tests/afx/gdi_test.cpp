@@ -12,7 +12,7 @@
 #include <gtest/gtest.h>
 #include <afxwin.h>
 
-#include "AfxTestHelpers.h"
+#include "AfxTestSupport.h"
 
 
 namespace {
