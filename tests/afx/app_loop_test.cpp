@@ -36,7 +36,7 @@ TEST(AppStartup, FrameworkKnowsTheApplication)
     EXPECT_EQ(::GetCurrentThreadId(), pApp->m_nThreadID);
 }
 
-struct WalkFixture : testing::Test
+struct AppPumpMessage : testing::Test
 {
     std::string trace;
     CWalkWnd top, parent, child;
@@ -62,8 +62,6 @@ struct WalkFixture : testing::Test
         ASSERT_TRUE(AfxGetApp()->PumpMessage());
     }
 };
-
-using AppPumpMessage = WalkFixture;
 
 TEST_F(AppPumpMessage, WalksFromTheWindowUpToItsTopLevelWindow)
 {

@@ -114,7 +114,7 @@ BEGIN_MESSAGE_MAP(CModalDlg, CDialog)
     ON_WM_TIMER()
 END_MESSAGE_MAP()
 
-struct ModalFixture : testing::Test
+struct DlgModal : testing::Test
 {
     DialogTemplate tmpl = MakeTemplate();
     CWnd owner;
@@ -131,8 +131,6 @@ struct ModalFixture : testing::Test
         orvane_test::PumpUntilIdle(50);
     }
 };
-
-using DlgModal = ModalFixture;
 
 TEST_F(DlgModal, EndDialogFromPostedMessageEndsTheLoopWithItsResult)
 {

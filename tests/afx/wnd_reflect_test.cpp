@@ -93,7 +93,7 @@ BEGIN_MESSAGE_MAP(CEatingEdit, CEdit)
     ON_CONTROL_REFLECT(EN_CHANGE, &CEatingEdit::OnChange)
 END_MESSAGE_MAP()
 
-struct ParentFixture : testing::Test
+struct WndReflect : testing::Test
 {
     CParentWnd parent;
 
@@ -107,8 +107,6 @@ struct ParentFixture : testing::Test
         orvane_test::PumpUntilIdle(50);
     }
 };
-
-using WndReflect = ParentFixture;
 
 TEST_F(WndReflect, EnChangeReachesEditThenParentWhenNotStopped)
 {
