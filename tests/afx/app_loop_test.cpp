@@ -12,11 +12,14 @@
 
 #include <gtest/gtest.h>
 
+#include "AfxTestSupport.h"
 #include "Input.h"
 
 #include <string>
 
 namespace {
+
+using afx_test::CWalkWnd;
 
 TEST(AppStartup, FrameworkKnowsTheApplication)
 {
@@ -33,29 +36,7 @@ TEST(AppStartup, FrameworkKnowsTheApplication)
     EXPECT_EQ(::GetCurrentThreadId(), pApp->m_nThreadID);
 }
 
-class CWalkWnd : public CWnd
-{
-public:
-    std::string* m_pTrace = nullptr;
-    const char* m_pszName = "";
-    BOOL m_bEat = FALSE;
-    int m_nKeyDowns = 0;
-
-    BOOL PreTranslateMessage(MSG* pMsg) override
-    {
-        if (pMsg->message == WM_KEYDOWN)
-            *m_pTrace += std::string(m_pszName) + ";";
-        return m_bEat;
-    }
-    afx_msg void OnKeyDown(UINT, UINT, UINT) { ++m_nKeyDowns; }
-    DECLARE_MESSAGE_MAP()
-};
-
-BEGIN_MESSAGE_MAP(CWalkWnd, CWnd)
-    ON_WM_KEYDOWN()
-END_MESSAGE_MAP()
-
-struct WalkFixture : testing::Test
+struct AppPumpMessage : testing::Test
 {
     std::string trace;
     CWalkWnd top, parent, child;
@@ -81,8 +62,6 @@ struct WalkFixture : testing::Test
         ASSERT_TRUE(AfxGetApp()->PumpMessage());
     }
 };
-
-using AppPumpMessage = WalkFixture;
 
 TEST_F(AppPumpMessage, WalksFromTheWindowUpToItsTopLevelWindow)
 {

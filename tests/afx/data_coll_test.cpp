@@ -10,6 +10,9 @@
 //   untyped collections the library uses
 #include <gtest/gtest.h>
 #include <afxtempl.h>
+
+#include "AfxTestSupport.h"
+
 #include <functional>
 #include <map>
 #include <set>
@@ -18,10 +21,8 @@
 
 namespace {
 
-std::wstring W(const CString& s)
-{
-    return std::wstring((LPCTSTR)s, (size_t)s.GetLength());
-}
+using afx_test::Throws;
+using afx_test::W;
 
 // Counts live instances, so leaks and double destruction show up as a count.
 struct Tracked
@@ -54,22 +55,6 @@ std::string JoinList(const LIST& l, bool backwards = false)
     for (POSITION pos = backwards ? l.GetTailPosition() : l.GetHeadPosition(); pos != NULL;)
         s += (s.empty() ? "" : ",") + std::to_string(backwards ? l.GetPrev(pos) : l.GetNext(pos));
     return s;
-}
-
-// Runs f and reports whether it threw CInvalidArgException (which it deletes).
-template<class F>
-bool ThrowsInvalidArg(F f)
-{
-    try
-    {
-        f();
-    }
-    catch (CInvalidArgException* e)
-    {
-        e->Delete();
-        return true;
-    }
-    return false;
 }
 
 } // namespace
@@ -165,7 +150,7 @@ TEST(CArrayTest, OutOfRangeThrowsInvalidArg)
         [&] { a.RemoveAt(-1); }, [&] { a.SetSize(-1); }, [&] { a.InsertAt(-1, 0); },
     };
     for (size_t i = 0; i < sizeof misuses / sizeof misuses[0]; ++i)
-        EXPECT_TRUE(ThrowsInvalidArg(misuses[i])) << "misuse " << i;
+        EXPECT_TRUE(Throws<CInvalidArgException>(misuses[i])) << "misuse " << i;
     EXPECT_EQ("1", Join(a));
 }
 
@@ -247,12 +232,12 @@ TEST(CListTest, ElementLifetimesAndEmptyListErrors)
     EXPECT_EQ(0, Tracked::s_live);
 
     CList<int, int> empty;
-    EXPECT_TRUE(ThrowsInvalidArg([&] { empty.RemoveHead(); }));
-    EXPECT_TRUE(ThrowsInvalidArg([&] { empty.RemoveTail(); }));
-    EXPECT_TRUE(ThrowsInvalidArg([&] { empty.GetHead(); }));
-    EXPECT_TRUE(ThrowsInvalidArg([&] { empty.RemoveAt(NULL); }));
+    EXPECT_TRUE(Throws<CInvalidArgException>([&] { empty.RemoveHead(); }));
+    EXPECT_TRUE(Throws<CInvalidArgException>([&] { empty.RemoveTail(); }));
+    EXPECT_TRUE(Throws<CInvalidArgException>([&] { empty.GetHead(); }));
+    EXPECT_TRUE(Throws<CInvalidArgException>([&] { empty.RemoveAt(NULL); }));
     POSITION pos = NULL;
-    EXPECT_TRUE(ThrowsInvalidArg([&] { empty.GetNext(pos); }));
+    EXPECT_TRUE(Throws<CInvalidArgException>([&] { empty.GetNext(pos); }));
 }
 
 // ---------------------------------------------------------------------------
@@ -320,7 +305,7 @@ TEST(CMapTest, IterationVisitsEachEntryOnce)
     POSITION none = NULL;
     int key;
     CString value;
-    EXPECT_TRUE(ThrowsInvalidArg([&] { m.GetNextAssoc(none, key, value); }));
+    EXPECT_TRUE(Throws<CInvalidArgException>([&] { m.GetNextAssoc(none, key, value); }));
 }
 
 TEST(CMapTest, InitHashTableKeepsEntriesAndPLookup)

@@ -8,37 +8,43 @@
 //   fixed attached blocks (cannot grow), Detach handing back the block.
 #include <gtest/gtest.h>
 #include <afx.h>
+
+#include "AfxTestSupport.h"
+
 #include <string>
 #include <vector>
 
 namespace {
 
-std::wstring W(const CString& s) { return std::wstring((LPCTSTR)s, (size_t)s.GetLength()); }
+using afx_test::Throws;
+using afx_test::W;
 
-// Runs f and returns the cause of the CFileException it threw (-1: none thrown).
+// The cause of the CFileException f threw (-1: none thrown), and its file name.
 template<class F>
 int FileExceptionCause(F f, CString* pFileName = NULL)
 {
-    try
-    {
-        f();
-    }
-    catch (CFileException* e)
-    {
-        const int cause = e->m_cause;
+    int cause = -1;
+    Throws<CFileException>(f, [&](CFileException* e) {
+        cause = e->m_cause;
         if (pFileName != NULL)
             *pFileName = e->m_strFileName;
-        e->Delete();
-        return cause;
-    }
-    return -1;
+    });
+    return cause;
 }
 
-TEST(CFileTest, ReadPastTheEndSetLengthNamesFailuresAndSharing)
+// A new empty file in the temporary folder.
+std::wstring TempFile()
 {
     WCHAR dir[MAX_PATH], name[MAX_PATH];
     ::GetTempPathW(MAX_PATH, dir);
     ::GetTempFileNameW(dir, L"afx", 0, name);
+    return name;
+}
+
+TEST(CFileTest, ReadPastTheEndSetLengthNamesFailuresAndSharing)
+{
+    const std::wstring path = TempFile();
+    LPCWSTR name = path.c_str();
     {
         CFile file;
         ASSERT_TRUE(file.Open(name, CFile::modeCreate | CFile::modeReadWrite));
@@ -83,9 +89,8 @@ TEST(CFileTest, ReadPastTheEndSetLengthNamesFailuresAndSharing)
 
 TEST(CFileTest, ModeFlagsAndHandles)
 {
-    WCHAR dir[MAX_PATH], name[MAX_PATH];
-    ::GetTempPathW(MAX_PATH, dir);
-    ::GetTempFileNameW(dir, L"afx", 0, name);
+    const std::wstring path = TempFile();
+    LPCWSTR name = path.c_str();
     CFile(name, CFile::modeCreate | CFile::modeWrite).Write("abcdef", 6);
     EXPECT_EQ(6u, CFile(name, CFile::modeCreate | CFile::modeNoTruncate | CFile::modeRead).GetLength());
     {
@@ -134,17 +139,7 @@ TEST(CMemFileTest, GrowsFillsGapsAndHandsBackBlocks)
     fixed.Write("\x09", 1);
     EXPECT_EQ(9, block[0]) << "writes go into the caller's block";
     fixed.SeekToEnd();
-    bool threw = false;
-    try
-    {
-        fixed.Write("x", 1);
-    }
-    catch (CMemoryException* e)
-    {
-        threw = true;
-        e->Delete();
-    }
-    EXPECT_TRUE(threw) << "a fixed block cannot grow";
+    EXPECT_TRUE(Throws<CMemoryException>([&] { fixed.Write("x", 1); })) << "a fixed block cannot grow";
     EXPECT_EQ(block, fixed.Detach());
 
     CMemFile grown(4);

@@ -6,7 +6,10 @@
 //   when the handler ends, THROW_LAST passes it on undeleted
 // - auto-deleting vs. the pre-allocated memory exception; error messages
 #include <gtest/gtest.h>
-#include <afx.h>
+#include <afxwin.h>
+
+#include "AfxTestSupport.h"
+
 #include <functional>
 #include <string>
 
@@ -82,12 +85,26 @@ TEST(RuntimeClass, CreateObjectThroughDynCreate)
     EXPECT_EQ(nullptr, RUNTIME_CLASS(CObject)->CreateObject());
 }
 
+// Classes of the executable (DYNCREATE and DYNAMIC records) and of the framework, by
+// narrow and wide name; names are case-sensitive.
+const struct { const char* name; CRuntimeClass* pClass; } kClassNames[] = {
+    { "CDataLeaf", RUNTIME_CLASS(CDataLeaf) },
+    { "CDataMiddle", RUNTIME_CLASS(CDataMiddle) },
+    { "CFileException", RUNTIME_CLASS(CFileException) },
+    { "CWnd", RUNTIME_CLASS(CWnd) },
+    { "cdataleaf", nullptr },
+    { "CNoSuchClass", nullptr },
+    { "", nullptr },
+};
+
 TEST(RuntimeClass, FromNameFindsRegisteredClasses)
 {
-    EXPECT_EQ(RUNTIME_CLASS(CDataLeaf), CRuntimeClass::FromName("CDataLeaf"));
-    EXPECT_EQ(RUNTIME_CLASS(CDataMiddle), CRuntimeClass::FromName(L"CDataMiddle"));
-    EXPECT_EQ(RUNTIME_CLASS(CFileException), CRuntimeClass::FromName("CFileException"));
-    EXPECT_EQ(nullptr, CRuntimeClass::FromName("CNoSuchClass"));
+    for (const auto& c : kClassNames)
+    {
+        EXPECT_EQ(c.pClass, CRuntimeClass::FromName(c.name)) << c.name;
+        EXPECT_EQ(c.pClass, CRuntimeClass::FromName(CString(c.name))) << c.name;
+    }
+    EXPECT_EQ(nullptr, CRuntimeClass::FromName((LPCSTR)NULL));
 }
 
 // ---------------------------------------------------------------------------
@@ -211,15 +228,9 @@ TEST(Exceptions, FileExceptionCausesFromOsErrors)
     };
     for (const auto& c : cases)
         EXPECT_EQ(c.cause, CFileException::OsErrorToException(c.error)) << "error " << c.error;
-    try
-    {
-        CFileException::ThrowOsError(ERROR_TOO_MANY_OPEN_FILES, L"f.txt");
-        ADD_FAILURE() << "nothing thrown";
-    }
-    catch (CFileException* e)
-    {
-        EXPECT_EQ(CFileException::tooManyOpenFiles, e->m_cause);
-        EXPECT_EQ(std::wstring(L"f.txt"), std::wstring((LPCTSTR)e->m_strFileName));
-        e->Delete();
-    }
+    EXPECT_TRUE(afx_test::Throws<CFileException>([] { CFileException::ThrowOsError(ERROR_TOO_MANY_OPEN_FILES, L"f.txt"); },
+        [](CFileException* e) {
+            EXPECT_EQ(CFileException::tooManyOpenFiles, e->m_cause);
+            EXPECT_EQ(L"f.txt", afx_test::W(e->m_strFileName));
+        }));
 }

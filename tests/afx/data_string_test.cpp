@@ -8,14 +8,14 @@
 //   missing id.
 #include <gtest/gtest.h>
 #include <afx.h>
+
+#include "AfxTestSupport.h"
+
 #include <string>
 
 namespace {
 
-std::wstring W(const CString& s)
-{
-    return std::wstring((LPCTSTR)s, (size_t)s.GetLength());
-}
+using afx_test::W;
 
 TEST(CStringLayout, OnePointerCopiesShareUntilOneWritesLockedBuffersAreNeverShared)
 {

@@ -6,17 +6,10 @@
 #include <gtest/gtest.h>
 #include <afx.h>
 #include <atltypes.h>
+
+#include "AfxTestSupport.h"
+
 #include <string>
-
-// gtest would print CRect through its LPRECT conversion, as an address.
-static void PrintTo(const CRect& r, std::ostream* os)
-{
-    *os << "(" << r.left << "," << r.top << ")-(" << r.right << "," << r.bottom << ")";
-}
-
-static void PrintTo(const CPoint& p, std::ostream* os) { *os << "(" << p.x << "," << p.y << ")"; }
-
-static void PrintTo(const CSize& s, std::ostream* os) { *os << "[" << s.cx << "x" << s.cy << "]"; }
 
 TEST(AtlTypes, PackedCoordinatesAreSignedAndTheMixedOperators)
 {

@@ -14,6 +14,7 @@
 
 #include <gtest/gtest.h>
 
+#include "AfxTestSupport.h"
 #include "Input.h"
 #include "DialogTemplate.h"
 
@@ -37,39 +38,6 @@ DialogTemplate MakeTemplate()
 
 /////////////////////////////////////////////////////////////////////////////
 
-class CTraceWnd : public CWnd
-{
-public:
-    std::string* m_pTrace = nullptr;
-    const char* m_pszName = "";
-    BOOL m_bEat = FALSE;
-    BOOL PreTranslateMessage(MSG* pMsg) override
-    {
-        if (pMsg->message == WM_KEYDOWN)
-            *m_pTrace += std::string(m_pszName) + ";";
-        return m_bEat;
-    }
-};
-
-class CTraceEdit : public CEdit
-{
-public:
-    std::string* m_pTrace = nullptr;
-    int m_nKeyDowns = 0;
-    BOOL PreTranslateMessage(MSG* pMsg) override
-    {
-        if (pMsg->message == WM_KEYDOWN)
-            *m_pTrace += "child;";
-        return FALSE;
-    }
-    afx_msg void OnKeyDown(UINT, UINT, UINT) { ++m_nKeyDowns; Default(); }
-    DECLARE_MESSAGE_MAP()
-};
-
-BEGIN_MESSAGE_MAP(CTraceEdit, CEdit)
-    ON_WM_KEYDOWN()
-END_MESSAGE_MAP()
-
 class CModalDlg : public CDialog
 {
 public:
@@ -80,8 +48,8 @@ public:
     BOOL m_bPanel = FALSE;
     BOOL m_bOwnerDisabledInLoop = FALSE;
     HWND m_hWndOwnerSeen = NULL;
-    CTraceWnd m_panel;
-    CTraceEdit m_panelEdit;
+    afx_test::CWalkWnd m_panel;
+    afx_test::CWalkWnd m_panelEdit;
     // temporaries
     HWND m_hWndTempInner = NULL;
     HWND m_hWndTempOuter = NULL;
@@ -107,7 +75,8 @@ public:
             m_panel.m_pszName = "parent";
             m_panel.Create(NULL, L"", WS_VISIBLE, CRect(0, 0, 200, 60), this, 2000);
             m_panelEdit.m_pTrace = &m_trace;
-            m_panelEdit.Create(WS_CHILD | WS_VISIBLE, CRect(0, 0, 100, 20), &m_panel, 2001);
+            m_panelEdit.m_pszName = "child";
+            m_panelEdit.CreateEx(0, L"EDIT", L"", WS_CHILD | WS_VISIBLE, CRect(0, 0, 100, 20), &m_panel, 2001);
             m_panelEdit.PostMessage(WM_KEYDOWN, 'A', 1);
         }
         if (m_hWndTempInner != NULL)
@@ -145,7 +114,7 @@ BEGIN_MESSAGE_MAP(CModalDlg, CDialog)
     ON_WM_TIMER()
 END_MESSAGE_MAP()
 
-struct ModalFixture : testing::Test
+struct DlgModal : testing::Test
 {
     DialogTemplate tmpl = MakeTemplate();
     CWnd owner;
@@ -162,8 +131,6 @@ struct ModalFixture : testing::Test
         orvane_test::PumpUntilIdle(50);
     }
 };
-
-using DlgModal = ModalFixture;
 
 TEST_F(DlgModal, EndDialogFromPostedMessageEndsTheLoopWithItsResult)
 {

@@ -8,7 +8,6 @@
 //   and AfxMessageBox by id load through the chain (a dialog by id: the colour
 //   pop-up of the buttons family)
 // - AfxTermExtensionModule takes the DLL out of the chain again
-// - FromName for a class registered by a DYNAMIC record in the executable
 #include <afxwin.h>
 
 #include <gtest/gtest.h>
@@ -16,25 +15,7 @@
 #include "Input.h"
 #include "ext_testdll.h"
 
-class CHostDynamic : public CObject
-{
-    DECLARE_DYNAMIC(CHostDynamic)
-};
-IMPLEMENT_DYNAMIC(CHostDynamic, CObject)
-
 namespace {
-
-TEST(ExtFromName, FindsClassesOfTheHostAndTheFramework)
-{
-    EXPECT_EQ(RUNTIME_CLASS(CHostDynamic), CRuntimeClass::FromName("CHostDynamic"));
-    EXPECT_EQ(RUNTIME_CLASS(CHostDynamic), CRuntimeClass::FromName(L"CHostDynamic"));
-    EXPECT_EQ(RUNTIME_CLASS(CWnd), CRuntimeClass::FromName("CWnd"));
-    EXPECT_EQ(RUNTIME_CLASS(CDialog), CRuntimeClass::FromName(L"CDialog"));
-    EXPECT_EQ(nullptr, CRuntimeClass::FromName("chostdynamic"));   // names are case-sensitive
-    EXPECT_EQ(nullptr, CRuntimeClass::FromName("NoSuchClass"));
-    EXPECT_EQ(nullptr, CRuntimeClass::FromName((LPCSTR)NULL));
-    EXPECT_EQ(nullptr, CRuntimeClass::FromName(L""));
-}
 
 // One test walks the whole life of the chain entry, since the DLL is inserted once.
 TEST(ExtChain, DynLinkLibraryInsertsAndRemovesTheDll)

@@ -12,11 +12,8 @@
 #include <gtest/gtest.h>
 #include <afxwin.h>
 
-// gtest would print a CRect through its LPRECT conversion, as an address.
-static void PrintTo(const CRect& rect, std::ostream* os)
-{
-    *os << "(" << rect.left << "," << rect.top << ")-(" << rect.right << "," << rect.bottom << ")";
-}
+#include "AfxTestSupport.h"
+
 
 namespace {
 

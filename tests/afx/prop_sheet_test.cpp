@@ -13,6 +13,8 @@
 #include "Input.h"
 #include "ext_testdll.h"
 
+#include <memory>
+
 namespace {
 
 class CProbePage : public CPropertyPage
@@ -60,17 +62,9 @@ private:
     bool* m_pbDeleted;
 };
 
-// The test DLL in the resource chain for one test.
-struct ExtChainScope
-{
-    ExtChainScope() : m_pLibrary(new CDynLinkLibrary(*ExtTestModule())) {}
-    ~ExtChainScope() { delete m_pLibrary; }
-    CDynLinkLibrary* m_pLibrary;
-};
-
 TEST(PropSheet, ChildSheetShowsAPageFromTheExtensionChain)
 {
-    ExtChainScope chain;
+    const std::unique_ptr<CDynLinkLibrary> chain(new CDynLinkLibrary(*ExtTestModule()));   // for this test
     orvane_test::HostWindow host(500, 400);
     CWnd* pHost = CWnd::FromHandle(host);
     bool bDeleted = false;
@@ -110,7 +104,7 @@ TEST(PropSheet, ChildSheetShowsAPageFromTheExtensionChain)
 
 TEST(PropSheet, FailedCreateHasRunPostNcDestroy)
 {
-    ExtChainScope chain;
+    const std::unique_ptr<CDynLinkLibrary> chain(new CDynLinkLibrary(*ExtTestModule()));   // for this test
     bool bDeleted = false;
     CProbeSheet* pSheet = new CProbeSheet(NULL, &bDeleted);
     // a child sheet needs a parent

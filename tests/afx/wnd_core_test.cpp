@@ -67,30 +67,32 @@ CRect PopupRect()
     return CRect(10, 10, 210, 160);
 }
 
-TEST(WndMessageMap, DerivedEntriesComeFirstAndBaseEntriesStillApply)
+// Sent in this order to one CDerivedWnd: what each returns (a handled command: 1) and
+// adds to the trace.
+const struct { const char* name; UINT message; WPARAM wParam; LPARAM lParam; LRESULT result; const char* trace; }
+kMapRows[] = {
+    { "derived entry first", WM_USER + 1, 0, 0, 21, "D:user1;" },
+    { "base entry", WM_USER + 2, 3, 4, 7, "B:user2;" },
+    { "unmapped: DefWindowProc", WM_USER + 3, 0, 0, 0, "" },
+    { "base timer", WM_TIMER, 42, 0, 0, "B:timer42;" },
+    { "registered", kRegisteredMsg, 5, 0, 10, "D:reg;" },
+    { "range start", WM_COMMAND, MAKEWPARAM(1000, 0), 0, 1, "B:cmd1000;" },
+    { "derived single id wins", WM_COMMAND, MAKEWPARAM(1005, 0), 0, 1, "D:cmd1005;" },
+    { "range end", WM_COMMAND, MAKEWPARAM(1009, 0), 0, 1, "B:cmd1009;" },
+    { "outside the range", WM_COMMAND, MAKEWPARAM(1010, 0), 0, 0, "" },
+};
+
+TEST(WndMessageMap, DerivedEntriesComeFirstBaseEntriesAndRangesStillApply)
 {
     CDerivedWnd wnd;
     ASSERT_TRUE(wnd.CreateEx(0, NULL, L"map", WS_POPUP, PopupRect(), NULL, 0));
-
-    EXPECT_EQ(21, wnd.SendMessage(WM_USER + 1));
-    EXPECT_EQ(7, wnd.SendMessage(WM_USER + 2, 3, 4));
-    EXPECT_EQ(0, wnd.SendMessage(WM_USER + 3));     // unmapped: DefWindowProc
-    wnd.SendMessage(WM_TIMER, 42);
-    EXPECT_EQ(10, wnd.SendMessage(kRegisteredMsg, 5));
-    EXPECT_EQ("D:user1;B:user2;B:timer42;D:reg;", wnd.m_trace);
-    wnd.DestroyWindow();
-}
-
-TEST(WndMessageMap, CommandsRouteByIdAndRange)
-{
-    CDerivedWnd wnd;
-    ASSERT_TRUE(wnd.CreateEx(0, NULL, L"cmd", WS_POPUP, PopupRect(), NULL, 0));
-
-    wnd.SendMessage(WM_COMMAND, MAKEWPARAM(1000, 0), 0);
-    wnd.SendMessage(WM_COMMAND, MAKEWPARAM(1005, 0), 0);   // derived single id wins
-    wnd.SendMessage(WM_COMMAND, MAKEWPARAM(1009, 0), 0);
-    wnd.SendMessage(WM_COMMAND, MAKEWPARAM(1010, 0), 0);   // outside the range
-    EXPECT_EQ("B:cmd1000;D:cmd1005;B:cmd1009;", wnd.m_trace);
+    for (const auto& row : kMapRows)
+    {
+        SCOPED_TRACE(row.name);
+        wnd.m_trace.clear();
+        EXPECT_EQ(row.result, wnd.SendMessage(row.message, row.wParam, row.lParam));
+        EXPECT_EQ(row.trace, wnd.m_trace);
+    }
     wnd.DestroyWindow();
 }
 
@@ -174,30 +176,30 @@ TEST(WndCreate, PreCreateWindowChangesTheStyle)
     wnd.DestroyWindow();
 }
 
-TEST(WndCreate, FailingOnCreateFailsCreateAndCleansUpOnce)
-{
-    CCreateWnd wnd;
-    wnd.m_nCreateResult = -1;
-    EXPECT_FALSE(wnd.CreateEx(0, NULL, L"fails", WS_POPUP, PopupRect(), NULL, 0));
-    EXPECT_EQ(NULL, wnd.m_hWnd);
-    EXPECT_EQ(1, wnd.m_nPostNcDestroy);
-    ASSERT_GE(wnd.m_seen.size(), 2u);
-    EXPECT_EQ((UINT)WM_CREATE, wnd.m_seen[1]);
-}
+// A creation that fails in OnCreate or for want of a class: no window, PostNcDestroy
+// once, and the hook not left armed (the next plain window is not captured).
+const struct { const char* name; LPCTSTR pszClass; int nCreateResult; std::vector<UINT> seen; } kFailedCreations[] = {
+    { "OnCreate fails", NULL, -1, { WM_NCCREATE, WM_CREATE } },
+    { "unknown class", L"NoSuchClass_Orvane", 0, {} },
+};
 
-TEST(WndCreate, UnknownClassFailsWithoutLeavingTheHookArmed)
+TEST(WndCreate, FailedCreationCleansUpOnceAndDisarmsTheHook)
 {
-    CCreateWnd wnd;
-    EXPECT_FALSE(wnd.CreateEx(0, L"NoSuchClass_Orvane", L"x", WS_POPUP, PopupRect(), NULL, 0));
-    EXPECT_EQ(NULL, wnd.m_hWnd);
-    EXPECT_EQ(1, wnd.m_nPostNcDestroy);
-
-    // The next plain window is not captured by the failed object.
-    HWND hPlain = ::CreateWindowExW(0, L"STATIC", L"plain", WS_POPUP, 0, 0, 10, 10, NULL, NULL, NULL, NULL);
-    ASSERT_NE(nullptr, hPlain);
-    EXPECT_EQ(nullptr, CWnd::FromHandlePermanent(hPlain));
-    EXPECT_EQ(NULL, wnd.m_hWnd);
-    ::DestroyWindow(hPlain);
+    for (const auto& c : kFailedCreations)
+    {
+        SCOPED_TRACE(c.name);
+        CCreateWnd wnd;
+        wnd.m_nCreateResult = c.nCreateResult;
+        EXPECT_FALSE(wnd.CreateEx(0, c.pszClass, L"fails", WS_POPUP, PopupRect(), NULL, 0));
+        EXPECT_EQ(NULL, wnd.m_hWnd);
+        EXPECT_EQ(1, wnd.m_nPostNcDestroy);
+        EXPECT_EQ(c.seen, wnd.m_seen);
+        HWND hPlain = ::CreateWindowExW(0, L"STATIC", L"plain", WS_POPUP, 0, 0, 10, 10, NULL, NULL, NULL, NULL);
+        ASSERT_NE(nullptr, hPlain);
+        EXPECT_EQ(nullptr, CWnd::FromHandlePermanent(hPlain));
+        EXPECT_EQ(NULL, wnd.m_hWnd);
+        ::DestroyWindow(hPlain);
+    }
 }
 
 TEST(WndCreate, SecondCreateOnTheSameObjectFails)
@@ -410,39 +412,26 @@ BEGIN_MESSAGE_MAP(CThrowingWnd, CWnd)
     ON_MESSAGE(WM_USER + 11, &CThrowingWnd::OnResourceException)
 END_MESSAGE_MAP()
 
-// The report box is system-modal: it activates before its text is set, so the
-// text is read (and the box answered) from a timer once the box runs its loop.
-HWND g_hWndReportBox = NULL;
-std::wstring g_strReportText;
-
-void CALLBACK ReadReportBox(HWND, UINT, UINT_PTR nIDEvent, DWORD)
-{
-    ::KillTimer(NULL, nIDEvent);
-    wchar_t szText[256] = L"";
-    ::GetDlgItemTextW(g_hWndReportBox, 0xFFFF, szText, 256);
-    g_strReportText = szText;
-    ::PostMessageW(g_hWndReportBox, WM_COMMAND, IDOK, 0);
-}
-
 TEST(WndExceptions, HandlerExceptionsAreCaughtAndReported)
 {
-    std::wstring appName = AfxGetAppName();
-    g_strReportText.clear();
-    orvane_test::DialogAnswerer answerer([&](const orvane_test::DialogAnswerer::Seen& seen) {
-        if (seen.caption != appName)
-            return 0;
-        g_hWndReportBox = seen.hwnd;
-        ::SetTimer(NULL, 0, 20, ReadReportBox);
-        return 0;
-    });
+    // The report box is system-modal: it activates before its text is set, so the
+    // text is read (and the box answered) from the script's timer inside its loop.
+    std::wstring caption, text;
+    orvane_test::ModalScript script({ [&](HWND box) {
+        caption = orvane_test::WindowText(box);
+        text = orvane_test::WindowText(::GetDlgItem(box, 0xFFFF));
+        ::PostMessageW(box, WM_COMMAND, IDOK, 0);
+        return true;
+    } });
 
     CThrowingWnd wnd;
     ASSERT_TRUE(wnd.CreateEx(0, NULL, L"throws", WS_POPUP, PopupRect(), NULL, 0));
     EXPECT_EQ(0, wnd.SendMessage(WM_USER + 10));    // user exceptions are silent
-    EXPECT_EQ(0, answerer.count());
+    EXPECT_EQ(0u, script.stepsDone());
     EXPECT_EQ(0, wnd.SendMessage(WM_USER + 11));    // others are reported
-    ASSERT_EQ(1, answerer.count());
-    EXPECT_EQ(L"A required resource was unavailable.", g_strReportText);
+    EXPECT_EQ(1u, script.stepsDone());
+    EXPECT_EQ(std::wstring(AfxGetAppName()), caption);
+    EXPECT_EQ(L"A required resource was unavailable.", text);
     wnd.DestroyWindow();
 
     // An exception in WM_CREATE fails the creation.

@@ -48,19 +48,37 @@ BEGIN_MESSAGE_MAP(CParentWnd, CWnd)
     ON_NOTIFY_RANGE(kCustomNotify, kChildId, kChildId + 5, &CParentWnd::OnChildNotify)
 END_MESSAGE_MAP()
 
-class CReflectEdit : public CEdit
+// One object for every reflected entry; created as an edit, a static or a plain window.
+class CReflector : public CWnd
 {
 public:
     std::string* m_pTrace = nullptr;
     BOOL m_bStop = FALSE;
+    int m_nDraws = 0;
+    UINT m_nCtlColor = 0xFFFF;
 
     afx_msg BOOL OnChange() { *m_pTrace += "E:change;"; return m_bStop; }
+    afx_msg BOOL OnCustom(NMHDR* pNMHDR, LRESULT* pResult)
+    {
+        *m_pTrace += "C:notify" + std::to_string((int)pNMHDR->code) + ";";
+        *pResult = 42;
+        return m_bStop;
+    }
+    afx_msg void DrawItem(LPDRAWITEMSTRUCT) { ++m_nDraws; }
+    afx_msg HBRUSH CtlColor(CDC*, UINT nCtlColor)
+    {
+        m_nCtlColor = nCtlColor;
+        return NULL;
+    }
 
     DECLARE_MESSAGE_MAP()
 };
 
-BEGIN_MESSAGE_MAP(CReflectEdit, CEdit)
-    ON_CONTROL_REFLECT_EX(EN_CHANGE, &CReflectEdit::OnChange)
+BEGIN_MESSAGE_MAP(CReflector, CWnd)
+    ON_CONTROL_REFLECT_EX(EN_CHANGE, &CReflector::OnChange)
+    ON_NOTIFY_REFLECT_EX(kCustomNotify, &CReflector::OnCustom)
+    ON_WM_DRAWITEM_REFLECT()
+    ON_WM_CTLCOLOR_REFLECT()
 END_MESSAGE_MAP()
 
 class CEatingEdit : public CEdit
@@ -75,7 +93,7 @@ BEGIN_MESSAGE_MAP(CEatingEdit, CEdit)
     ON_CONTROL_REFLECT(EN_CHANGE, &CEatingEdit::OnChange)
 END_MESSAGE_MAP()
 
-struct ParentFixture : testing::Test
+struct WndReflect : testing::Test
 {
     CParentWnd parent;
 
@@ -90,13 +108,11 @@ struct ParentFixture : testing::Test
     }
 };
 
-using WndReflect = ParentFixture;
-
 TEST_F(WndReflect, EnChangeReachesEditThenParentWhenNotStopped)
 {
-    CReflectEdit edit;
+    CReflector edit;
     edit.m_pTrace = &parent.m_trace;
-    ASSERT_TRUE(edit.Create(WS_CHILD | WS_VISIBLE, CRect(0, 0, 100, 20), &parent, kEditId));
+    ASSERT_TRUE(edit.CreateEx(0, L"EDIT", L"", WS_CHILD | WS_VISIBLE, CRect(0, 0, 100, 20), &parent, kEditId));
 
     edit.SetWindowText(L"1");
     EXPECT_EQ("E:change;P:change;", parent.m_trace);
@@ -126,65 +142,34 @@ TEST_F(WndReflect, ControlWithoutObjectNotifiesTheParentDirectly)
     EXPECT_EQ("P:plain;", parent.m_trace);
 }
 
-class CNotifyChild : public CWnd
-{
-public:
-    std::string* m_pTrace = nullptr;
-    BOOL m_bStop = FALSE;
-
-    afx_msg BOOL OnCustom(NMHDR* pNMHDR, LRESULT* pResult)
-    {
-        *m_pTrace += "C:notify" + std::to_string((int)pNMHDR->code) + ";";
-        *pResult = 42;
-        return m_bStop;
-    }
-    DECLARE_MESSAGE_MAP()
+// The parent's range handler answers 7, the child's reflected one 42; another code is
+// not reflected, and the parent's range does not cover it.
+const struct { BOOL bStop; UINT code; const char* trace; LRESULT result; } kNotifySteps[] = {
+    { FALSE, (UINT)kCustomNotify, "C:notify-1234;P:notify104;", 7 },
+    { TRUE, (UINT)kCustomNotify, "C:notify-1234;", 42 },
+    { FALSE, NM_CLICK, "", 0 },
 };
-
-BEGIN_MESSAGE_MAP(CNotifyChild, CWnd)
-    ON_NOTIFY_REFLECT_EX(kCustomNotify, &CNotifyChild::OnCustom)
-END_MESSAGE_MAP()
 
 TEST_F(WndReflect, NotifyReachesChildThenParentWhenNotStopped)
 {
-    CNotifyChild child;
+    CReflector child;
     child.m_pTrace = &parent.m_trace;
     ASSERT_TRUE(child.Create(NULL, L"", WS_VISIBLE, CRect(0, 60, 50, 80), &parent, kChildId + 2));
-
-    NMHDR nmhdr = { child.m_hWnd, kChildId + 2, (UINT)kCustomNotify };
     parent.m_lNotifyResult = 7;
-    LRESULT lResult = parent.SendMessage(WM_NOTIFY, nmhdr.idFrom, (LPARAM)&nmhdr);
-    EXPECT_EQ("C:notify-1234;P:notify104;", parent.m_trace);
-    EXPECT_EQ(7, lResult);  // the parent's handler wrote last
-
-    parent.m_trace.clear();
-    child.m_bStop = TRUE;
-    lResult = parent.SendMessage(WM_NOTIFY, nmhdr.idFrom, (LPARAM)&nmhdr);
-    EXPECT_EQ("C:notify-1234;", parent.m_trace);
-    EXPECT_EQ(42, lResult);
-
-    // Another code is not reflected; the parent's range does not cover it.
-    parent.m_trace.clear();
-    nmhdr.code = NM_CLICK;
-    EXPECT_EQ(0, parent.SendMessage(WM_NOTIFY, nmhdr.idFrom, (LPARAM)&nmhdr));
-    EXPECT_EQ("", parent.m_trace);
+    for (const auto& step : kNotifySteps)
+    {
+        SCOPED_TRACE(step.trace);
+        parent.m_trace.clear();
+        child.m_bStop = step.bStop;
+        NMHDR nmhdr = { child.m_hWnd, kChildId + 2, step.code };
+        EXPECT_EQ(step.result, parent.SendMessage(WM_NOTIFY, nmhdr.idFrom, (LPARAM)&nmhdr));
+        EXPECT_EQ(step.trace, parent.m_trace);
+    }
 }
-
-class CDrawReflectWnd : public CWnd
-{
-public:
-    int m_nDraws = 0;
-    afx_msg void DrawItem(LPDRAWITEMSTRUCT lpDIS) { ++m_nDraws; (void)lpDIS; }
-    DECLARE_MESSAGE_MAP()
-};
-
-BEGIN_MESSAGE_MAP(CDrawReflectWnd, CWnd)
-    ON_WM_DRAWITEM_REFLECT()
-END_MESSAGE_MAP()
 
 TEST_F(WndReflect, DrawItemReflectMacroReachesPlainWindow)
 {
-    CDrawReflectWnd child;
+    CReflector child;
     ASSERT_TRUE(child.Create(NULL, L"", WS_VISIBLE, CRect(0, 0, 20, 20), &parent, 104));
     DRAWITEMSTRUCT dis = {};
     dis.CtlType = ODT_STATIC;
@@ -199,27 +184,11 @@ TEST_F(WndReflect, DrawItemReflectMacroReachesPlainWindow)
     EXPECT_EQ(1, child.m_nDraws);
 }
 
-class CColorStatic : public CStatic
-{
-public:
-    UINT m_nCtlColor = 0xFFFF;
-    afx_msg HBRUSH CtlColor(CDC*, UINT nCtlColor)
-    {
-        m_nCtlColor = nCtlColor;
-        return NULL;
-    }
-    DECLARE_MESSAGE_MAP()
-};
-
-BEGIN_MESSAGE_MAP(CColorStatic, CStatic)
-    ON_WM_CTLCOLOR_REFLECT()
-END_MESSAGE_MAP()
-
 TEST_F(WndReflect, CtlColorReflectWithoutABrushLeavesItToTheParent)
 {
     // The reflected brush itself is a row of the dispatch table.
-    CColorStatic label;
-    ASSERT_TRUE(label.Create(L"text", WS_CHILD | WS_VISIBLE, CRect(0, 140, 80, 160), &parent, 105));
+    CReflector label;
+    ASSERT_TRUE(label.CreateEx(0, L"STATIC", L"text", WS_CHILD | WS_VISIBLE, CRect(0, 140, 80, 160), &parent, 105));
     HDC hDC = ::GetDC(label.m_hWnd);
     const LRESULT lResult = parent.SendMessage(WM_CTLCOLORSTATIC, (WPARAM)hDC, (LPARAM)label.m_hWnd);
     EXPECT_EQ((UINT)CTLCOLOR_STATIC, label.m_nCtlColor);
@@ -238,9 +207,9 @@ TEST(WndReflectLockout, UpdateDataDoesNotRouteTheChangesItCauses)
 {
     CDataParent parent;
     ASSERT_TRUE(parent.CreateEx(0, NULL, L"data", WS_POPUP, CRect(0, 0, 200, 100), NULL, 0));
-    CReflectEdit edit;
+    CReflector edit;
     edit.m_pTrace = &parent.m_trace;
-    ASSERT_TRUE(edit.Create(WS_CHILD | WS_VISIBLE, CRect(0, 0, 100, 20), &parent, kEditId));
+    ASSERT_TRUE(edit.CreateEx(0, L"EDIT", L"", WS_CHILD | WS_VISIBLE, CRect(0, 0, 100, 20), &parent, kEditId));
 
     parent.m_strValue = L"loaded";
     EXPECT_TRUE(parent.UpdateData(FALSE));

@@ -13,6 +13,7 @@
 #include <gtest/gtest.h>
 
 #include "KVXHeaderCtrlClipboardFormats.h"
+#include "Input.h"
 #include "OrvaneLibrary.h"
 #include "resource.h"
 
@@ -75,13 +76,7 @@ TEST(LibraryFrame, StringTableYieldsTheExactTextsAndNothingElse)
         EXPECT_FALSE(CString().LoadString(id)) << id;
 }
 
-std::wstring Text(CWnd* pWnd)
-{
-    CString text;
-    if (pWnd != NULL)
-        pWnd->GetWindowText(text);
-    return static_cast<LPCTSTR>(text);
-}
+using orvane_test::WindowText;
 
 TEST(LibraryFrame, TemplatesLoadThroughTheChainWithTheControlsTheLibraryUses)
 {
@@ -98,8 +93,8 @@ TEST(LibraryFrame, TemplatesLoadThroughTheChainWithTheControlsTheLibraryUses)
     CDialog popup;   // a host asking by number alone gets the German template
     ASSERT_TRUE(popup.Create(IDD_COLOR_POPUP));
     EXPECT_EQ(static_cast<DWORD>(WS_POPUP | DS_MODALFRAME), popup.GetStyle() & (WS_POPUP | DS_MODALFRAME | WS_CHILD));
-    EXPECT_EQ(L"Dummy", Text(popup.GetDlgItem(IDC_COLOR_DUMMY)));
-    EXPECT_EQ(L"&Other...", Text(popup.GetDlgItem(IDC_COLOR_OTHER)));
+    EXPECT_EQ(L"Dummy", WindowText(::GetDlgItem(popup, IDC_COLOR_DUMMY)));
+    EXPECT_EQ(L"&Other...", WindowText(::GetDlgItem(popup, IDC_COLOR_OTHER)));
     popup.DestroyWindow();
 
     CWnd host;
@@ -107,8 +102,8 @@ TEST(LibraryFrame, TemplatesLoadThroughTheChainWithTheControlsTheLibraryUses)
     CDialog columns, page;
     ASSERT_TRUE(columns.Create(IDD_COLUMNS_PAGE, &host));
     ASSERT_TRUE(page.Create(IDD_MY_PAGE, &host));
-    EXPECT_EQ(L"Columns", Text(&columns));
-    EXPECT_EQ(L"My Page", Text(&page));
+    EXPECT_EQ(L"Columns", WindowText(columns));
+    EXPECT_EQ(L"My Page", WindowText(page));
     EXPECT_EQ(static_cast<DWORD>(WS_CHILD | WS_DISABLED | WS_CAPTION), columns.GetStyle() & (WS_CHILD | WS_DISABLED | WS_CAPTION));
     CWnd* pList = columns.GetDlgItem(IDC_COLUMNS_LIST);
     ASSERT_NE(nullptr, pList);

@@ -78,6 +78,13 @@ bool IsNoise(UINT message)
     }
 }
 
+bool FieldsMatch(const MsgEntry& x, const MsgEntry& y)
+{
+    return x.message == y.message && (!(x.flags & WParam) || x.wParam == y.wParam) &&
+           (!(x.flags & LParam) || x.lParam == y.lParam) && (!(x.flags & Id) || x.id == y.id) &&
+           ((x.flags & Parent) != 0) == ((y.flags & Parent) != 0);
+}
+
 } // namespace
 
 std::string MessageName(UINT message)
@@ -139,9 +146,8 @@ void MsgLog::SpyWindow(HWND hwnd, int stream)
 
 void MsgLog::SpyParent(HWND hwnd, int stream)
 {
-    Spy* spy = new Spy{ hwnd, stream, true, this };
-    m_spies.push_back(spy);
-    SetWindowSubclass(hwnd, SpyProc, reinterpret_cast<UINT_PTR>(spy), reinterpret_cast<DWORD_PTR>(spy));
+    SpyWindow(hwnd, stream);
+    m_spies.back()->parent = true;
 }
 
 void MsgLog::Unspy(HWND hwnd)
@@ -205,36 +211,26 @@ testing::AssertionResult MsgLog::Match(int stream, const MsgEntry* expected, con
     for (const MsgEntry* e = expected; e && e->message; ++e)
         want.push_back(*e);
 
-    std::ostringstream why;
+    // Equal messages compare their flagged fields; an optional entry that does not
+    // match is skipped.
     size_t a = 0, w = 0;
     bool ok = true;
-    while (w < want.size() || a < actual.size())
+    while (ok && (w < want.size() || a < actual.size()))
     {
-        if (w < want.size() && a < actual.size() && want[w].message == actual[a].message)
+        if (w < want.size() && a < actual.size() && FieldsMatch(want[w], actual[a]))
         {
-            const MsgEntry& x = want[w];
-            const MsgEntry& y = actual[a];
-            bool same = true;
-            if ((x.flags & WParam) && x.wParam != y.wParam) same = false;
-            if ((x.flags & LParam) && x.lParam != y.lParam) same = false;
-            if ((x.flags & Id) && x.id != y.id) same = false;
-            if (((x.flags & Parent) != 0) != ((y.flags & Parent) != 0)) same = false;
-            if (!same)
-            {
-                if (x.flags & Optional) { ++w; continue; }
-                ok = false;
-                break;
-            }
-            ++w; ++a;
-            continue;
+            ++w;
+            ++a;
         }
-        if (w < want.size() && (want[w].flags & Optional)) { ++w; continue; }
-        ok = false;
-        break;
+        else if (w < want.size() && (want[w].flags & Optional))
+            ++w;
+        else
+            ok = false;
     }
     if (ok)
         return testing::AssertionSuccess();
 
+    std::ostringstream why;
     why << file << ":" << line << ": message sequence differs\n";
     size_t n = want.size() > actual.size() ? want.size() : actual.size();
     for (size_t i = 0; i < n; ++i)

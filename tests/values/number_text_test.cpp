@@ -11,6 +11,7 @@
 #include <climits>
 #include <cmath>
 #include <cstring>
+#include <iterator>
 #include <random>
 #include <string>
 
@@ -19,14 +20,35 @@
 namespace
 {
 
-struct LongCase
+// One boundary row of the grammar for values of type T.
+template<class T>
+struct GrammarCase
 {
     const char* name;
     const wchar_t* text;
     KVTEnumConvertType code;
-    long value;     // checked for KVT_CONVERT_OK
+    T value;        // checked for KVT_CONVERT_OK
     int errorPos;   // checked always (0 unless a syntax error)
 };
+
+// A failed conversion leaves the value as it was.
+template<class T>
+void ExpectRows(const GrammarCase<T>* rows, size_t count,
+                KVTEnumConvertType (*parse)(const wchar_t*, int, T&, int&))
+{
+    for (const GrammarCase<T>* c = rows; c != rows + count; ++c)
+    {
+        SCOPED_TRACE(c->name);
+        T value = T(12345);
+        int errorPos = -99;
+        EXPECT_EQ(c->code, parse(c->text, -1, value, errorPos));
+        EXPECT_EQ(c->errorPos, errorPos);
+        EXPECT_EQ(c->code == KVT_CONVERT_OK ? c->value : T(12345), value);
+    }
+}
+
+using LongCase = GrammarCase<long>;
+using DoubleCase = GrammarCase<double>;
 
 const LongCase kLongCases[] = {
     { "Max", L"2147483647", KVT_CONVERT_OK, LONG_MAX, 0 },
@@ -56,24 +78,8 @@ const LongCase kLongCases[] = {
 
 TEST(LongGrammar, BoundaryRows)
 {
-    for (const LongCase& c : kLongCases)
-    {
-        long value = 12345;
-        int errorPos = -99;
-        EXPECT_EQ(c.code, KvtParseLong(c.text, -1, value, errorPos)) << c.name;
-        EXPECT_EQ(c.errorPos, errorPos) << c.name;
-        EXPECT_EQ(c.code == KVT_CONVERT_OK ? c.value : 12345, value) << c.name << ": a failed conversion leaves the value";
-    }
+    ExpectRows(kLongCases, std::size(kLongCases), KvtParseLong);
 }
-
-struct DoubleCase
-{
-    const char* name;
-    const wchar_t* text;
-    KVTEnumConvertType code;
-    double value;
-    int errorPos;
-};
 
 const DoubleCase kDoubleCases[] = {
     { "LargestDouble", L"1.7976931348623157e308", KVT_CONVERT_OK, DBL_MAX, 0 },
@@ -98,14 +104,7 @@ const DoubleCase kDoubleCases[] = {
 
 TEST(DoubleGrammar, BoundaryRows)
 {
-    for (const DoubleCase& c : kDoubleCases)
-    {
-        double value = 12345.0;
-        int errorPos = -99;
-        EXPECT_EQ(c.code, KvtParseDouble(c.text, -1, value, errorPos)) << c.name;
-        EXPECT_EQ(c.errorPos, errorPos) << c.name;
-        EXPECT_EQ(c.code == KVT_CONVERT_OK ? c.value : 12345.0, value) << c.name;
-    }
+    ExpectRows(kDoubleCases, std::size(kDoubleCases), KvtParseDouble);
 }
 
 TEST(GrammarLength, ExplicitLengthStopsBeforeTheRest)

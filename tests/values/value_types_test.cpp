@@ -82,40 +82,65 @@ TEST(KVXStringFormat, PrintfStyleAndTheGrammarCharacters)
 /////////////////////////////////////////////////////////////////////////////
 // KVXVariant
 
-TEST(KVXVariantEquality, AsCOleVariant)
+// A raw variant of any type; the bits fill the union from its first byte.
+VARIANT MakeVariant(VARTYPE vt, LONGLONG bits)
 {
-    EXPECT_EQ(KVXVariant(), KVXVariant());
-    EXPECT_EQ(KVXVariant(5L), KVXVariant(5L));
-    EXPECT_NE(KVXVariant(5L), KVXVariant(6L));
-    EXPECT_NE(KVXVariant(1L), KVXVariant(1.0)) << "type counts";
-    EXPECT_NE(KVXVariant(), KVXVariant(0L)) << "empty is not zero";
-    EXPECT_NE(KVXVariant(NAN), KVXVariant(NAN));
-    EXPECT_EQ(KVXVariant(KVXString(L"abc")), KVXVariant(KVXString(L"abc")));
-    EXPECT_NE(KVXVariant(KVXString(L"ab")), KVXVariant(KVXString(L"abc")));
-    EXPECT_FALSE(KVXVariant(3L) != KVXVariant(3L));
+    VARIANT var;
+    VariantInit(&var);
+    var.vt = vt;
+    var.llVal = bits;
+    return var;
 }
 
-TEST(KVXVariantEquality, RawVariants)
+VARIANT MakeSingle(float value)
 {
-    VARIANT a, b;
-    VariantInit(&a);
-    VariantInit(&b);
-    a.vt = b.vt = VT_NULL;
-    EXPECT_TRUE(KvtVariantEqual(a, b));
-    a.vt = b.vt = VT_BOOL;
-    a.boolVal = VARIANT_TRUE;
-    b.boolVal = VARIANT_FALSE;
-    EXPECT_FALSE(KvtVariantEqual(a, b));
-    a.vt = b.vt = VT_CY;
-    a.cyVal.int64 = b.cyVal.int64 = 12345;
-    EXPECT_TRUE(KvtVariantEqual(a, b));
-    a.vt = b.vt = VT_I2;
-    a.iVal = 7;
-    b.iVal = 7;
-    EXPECT_TRUE(KvtVariantEqual(a, b));
-    b.vt = VT_I4;
-    b.lVal = 7;
-    EXPECT_FALSE(KvtVariantEqual(a, b));
+    VARIANT var = MakeVariant(VT_R4, 0);
+    var.fltVal = value;
+    return var;
+}
+
+LONG g_referenced = 1234;
+
+VARIANT MakeReference()
+{
+    VARIANT var = MakeVariant(VT_I4 | VT_BYREF, 0);
+    var.plVal = &g_referenced;
+    return var;
+}
+
+struct EqualityCase
+{
+    const char* name;
+    KVXVariant a, b;
+    bool equal;
+};
+
+const EqualityCase kEqualityCases[] = {
+    { "BothEmpty", KVXVariant(), KVXVariant(), true },
+    { "SameLong", 5L, 5L, true },
+    { "OtherLong", 5L, 6L, false },
+    { "TypeCounts", 1L, 1.0, false },
+    { "EmptyIsNotZero", KVXVariant(), 0L, false },
+    { "NanIsNotNan", NAN, NAN, false },
+    { "SameText", KVXString(L"abc"), KVXString(L"abc"), true },
+    { "OtherText", KVXString(L"ab"), KVXString(L"abc"), false },
+    { "BothNull", MakeVariant(VT_NULL, 0), MakeVariant(VT_NULL, 0), true },
+    { "OtherBool", MakeVariant(VT_BOOL, VARIANT_TRUE), MakeVariant(VT_BOOL, VARIANT_FALSE), false },
+    { "SameCurrency", MakeVariant(VT_CY, 12345), MakeVariant(VT_CY, 12345), true },
+    { "SameShort", MakeVariant(VT_I2, 7), MakeVariant(VT_I2, 7), true },
+    { "ShortIsNotLong", MakeVariant(VT_I2, 7), MakeVariant(VT_I4, 7), false },
+    { "SameReference", MakeReference(), MakeReference(), true },
+};
+
+TEST(KVXVariantEquality, AsCOleVariant)
+{
+    for (const EqualityCase& c : kEqualityCases)
+    {
+        SCOPED_TRACE(c.name);
+        EXPECT_EQ(c.equal, KvtVariantEqual(c.a.GetVariant(), c.b.GetVariant()));
+        EXPECT_EQ(c.equal, c.a == c.b);
+        EXPECT_EQ(!c.equal, c.a != c.b);
+    }
 }
 
 TEST(KVXVariantLifetime, CopiesOwnTheirText)
@@ -148,20 +173,6 @@ TEST(KVXVariantLifetime, CopiesOwnTheirText)
     EXPECT_EQ(VT_EMPTY, assigned.GetType());
 }
 
-TEST(KVXVariantConversion, EmptyConvertsToZero)
-{
-    KVXVariant empty;
-    long lValue = 99;
-    double dValue = 99.0;
-    KVXString text(L"x");
-    EXPECT_EQ(KVT_VARIANT_OK, empty.GetAs(lValue, 1));
-    EXPECT_EQ(0, lValue);
-    EXPECT_EQ(KVT_VARIANT_OK, empty.GetAs(dValue));
-    EXPECT_EQ(0.0, dValue);
-    EXPECT_EQ(KVT_VARIANT_OK, empty.GetAs(text));
-    EXPECT_EQ(L"", Text(text));
-}
-
 struct ToLongCase
 {
     const char* name;
@@ -170,25 +181,8 @@ struct ToLongCase
     long expected;
 };
 
-VARIANT MakeVariant(VARTYPE vt, LONGLONG bits)
-{
-    VARIANT var;
-    VariantInit(&var);
-    var.vt = vt;
-    var.llVal = bits;
-    return var;
-}
-
-VARIANT MakeBool(bool value)
-{
-    VARIANT var;
-    VariantInit(&var);
-    var.vt = VT_BOOL;
-    var.boolVal = value ? VARIANT_TRUE : VARIANT_FALSE;
-    return var;
-}
-
 const ToLongCase kToLongCases[] = {
+    { "EmptyIsZero", KVXVariant(), KVT_VARIANT_OK, 0 },
     { "Long", KVXVariant(-42L), KVT_VARIANT_OK, -42 },
     { "WholeDouble", KVXVariant(7.0), KVT_VARIANT_OK, 7 },
     { "HalfRoundsToEvenDown", KVXVariant(2.5), KVT_VARIANT_OK, 2 },
@@ -201,10 +195,11 @@ const ToLongCase kToLongCases[] = {
     { "TextOverflow", KVXVariant(KVXString(L"2147483648")), KVT_VARIANT_OVERFLOW, 0 },
     { "TextEmpty", KVXVariant(KVXString(L"")), KVT_VARIANT_NOT_A_NUMBER, 0 },
     { "Short", KVXVariant(MakeVariant(VT_I2, 300)), KVT_VARIANT_OK, 300 },
-    { "Bool", KVXVariant(MakeBool(true)), KVT_VARIANT_OK, -1 },
+    { "Bool", KVXVariant(MakeVariant(VT_BOOL, VARIANT_TRUE)), KVT_VARIANT_OK, -1 },
     { "Null", KVXVariant(MakeVariant(VT_NULL, 0)), KVT_VARIANT_TYPE_MISMATCH, 0 },
     { "UnsignedTooBig", KVXVariant(MakeVariant(VT_UI4, 0xFFFFFFFF)), KVT_VARIANT_OVERFLOW, 0 },
     { "UnsignedFits", KVXVariant(MakeVariant(VT_UI4, 0x7FFFFFFF)), KVT_VARIANT_OK, LONG_MAX },
+    { "ByReference", KVXVariant(MakeReference()), KVT_VARIANT_OK, 1234 },
     { "Int64Fits", KVXVariant(MakeVariant(VT_I8, -5)), KVT_VARIANT_OK, -5 },
     { "Int64TooBig", KVXVariant(MakeVariant(VT_I8, 1LL << 40)), KVT_VARIANT_OVERFLOW, 0 },
     { "Int64TooSmall", KVXVariant(MakeVariant(VT_I8, -(1LL << 31) - 1)), KVT_VARIANT_OVERFLOW, 0 },
@@ -221,18 +216,10 @@ TEST(KVXVariantConversion, ToLong)
     }
 }
 
-VARIANT MakeSingle(float value)
-{
-    VARIANT var;
-    VariantInit(&var);
-    var.vt = VT_R4;
-    var.fltVal = value;
-    return var;
-}
-
 TEST(KVXVariantConversion, ToDoubleAndToText)
 {
     const struct { const char* name; KVXVariant value; KVTEnumVariantError result; double expected; } doubles[] = {
+        { "EmptyIsZero", KVXVariant(), KVT_VARIANT_OK, 0.0 },
         { "Long", KVXVariant(-3L), KVT_VARIANT_OK, -3.0 },
         { "TextExponent", KVXVariant(KVXString(L"1.5e3")), KVT_VARIANT_OK, 1500.0 },
         { "TextOverflow", KVXVariant(KVXString(L"1e309")), KVT_VARIANT_OVERFLOW, 0 },
@@ -248,42 +235,26 @@ TEST(KVXVariantConversion, ToDoubleAndToText)
         EXPECT_EQ(c.result, c.value.GetAs(value)) << c.name;
         EXPECT_EQ(c.result == KVT_VARIANT_OK ? c.expected : 7.0, value) << c.name;
     }
-    const struct { KVXVariant value; const wchar_t* text; } texts[] = {
-        { KVXVariant(-42L), L"-42" },
-        { KVXVariant(0.1), L"0.1" },
-        { KVXVariant(1e300), L"1e+300" },
-        { KVXVariant(MakeSingle(0.1f)), L"0.1" },
-        { KVXVariant(MakeVariant(VT_I2, -7)), L"-7" },
-        { KVXVariant(MakeVariant(VT_UI4, 0xFFFFFFFF)), L"4294967295" },
-        { KVXVariant(MakeVariant(VT_I8, INT64_MIN)), L"-9223372036854775808" },
-        { KVXVariant(MakeVariant(VT_UI8, -1)), L"18446744073709551615" },
+    // A failed conversion leaves the text as it was.
+    const struct { KVXVariant value; KVTEnumVariantError result; const wchar_t* text; } texts[] = {
+        { KVXVariant(), KVT_VARIANT_OK, L"" },
+        { KVXVariant(-42L), KVT_VARIANT_OK, L"-42" },
+        { KVXVariant(0.1), KVT_VARIANT_OK, L"0.1" },
+        { KVXVariant(1e300), KVT_VARIANT_OK, L"1e+300" },
+        { KVXVariant(MakeSingle(0.1f)), KVT_VARIANT_OK, L"0.1" },
+        { KVXVariant(MakeVariant(VT_I2, -7)), KVT_VARIANT_OK, L"-7" },
+        { KVXVariant(MakeReference()), KVT_VARIANT_OK, L"1234" },
+        { KVXVariant(MakeVariant(VT_UI4, 0xFFFFFFFF)), KVT_VARIANT_OK, L"4294967295" },
+        { KVXVariant(MakeVariant(VT_I8, INT64_MIN)), KVT_VARIANT_OK, L"-9223372036854775808" },
+        { KVXVariant(MakeVariant(VT_UI8, -1)), KVT_VARIANT_OK, L"18446744073709551615" },
+        { KVXVariant(MakeVariant(VT_NULL, 0)), KVT_VARIANT_TYPE_MISMATCH, L"unset" },
     };
     for (const auto& c : texts)
     {
-        KVXString text;
-        EXPECT_EQ(KVT_VARIANT_OK, c.value.GetAs(text)) << Text(KVXString(c.text));
+        KVXString text(L"unset");
+        EXPECT_EQ(c.result, c.value.GetAs(text)) << Text(KVXString(c.text));
         EXPECT_EQ(std::wstring(c.text), Text(text));
     }
-    KVXString kept(L"kept");
-    EXPECT_EQ(KVT_VARIANT_TYPE_MISMATCH, KVXVariant(MakeVariant(VT_NULL, 0)).GetAs(kept));
-    EXPECT_EQ(L"kept", Text(kept));
-}
-
-TEST(KVXVariantConversion, ByReferenceValues)
-{
-    LONG target = 1234;
-    VARIANT byRef;
-    VariantInit(&byRef);
-    byRef.vt = VT_I4 | VT_BYREF;
-    byRef.plVal = &target;
-    KVXVariant var(byRef);
-    long lValue = 0;
-    EXPECT_EQ(KVT_VARIANT_OK, var.GetAs(lValue));
-    EXPECT_EQ(1234, lValue);
-    KVXString text;
-    EXPECT_EQ(KVT_VARIANT_OK, var.GetAs(text));
-    EXPECT_EQ(L"1234", Text(text));
-    EXPECT_EQ(KVXVariant(byRef), var) << "the same reference";
 }
 
 /////////////////////////////////////////////////////////////////////////////
@@ -367,6 +338,14 @@ const InRangeCase kInRangeCases[] = {
     { "NanEnd", NAN, 1.0, true, true, NAN, 1.0, false },
 };
 
+// Type and shortest exact text of a value (NaN as "nan").
+std::wstring Shown(const KVXVariant& value)
+{
+    KVXString text;
+    value.GetAs(text);
+    return std::to_wstring(value.GetType()) + L": " + Text(text);
+}
+
 TEST(KVXRangeTable, InRangeValues)
 {
     for (const InRangeCase& c : kInRangeCases)
@@ -374,18 +353,8 @@ TEST(KVXRangeTable, InRangeValues)
         SCOPED_TRACE(c.name);
         const KVXRange range = MakeRange(c.minimum, c.maximum, c.minInclude, c.maxInclude);
         const KVXVariant lowest = range.GetMinimumInRange(), highest = range.GetMaximumInRange();
-        double low = 0.0, high = 0.0, expectedLow = 0.0, expectedHigh = 0.0;
-        lowest.GetAs(low);
-        highest.GetAs(high);
-        c.lowest.GetAs(expectedLow);
-        c.highest.GetAs(expectedHigh);
-        if (std::isnan(expectedLow))
-            EXPECT_TRUE(std::isnan(low)) << low;
-        else
-            EXPECT_EQ(expectedLow, low);
-        EXPECT_EQ(expectedHigh, high);
-        EXPECT_EQ(c.lowest.GetType(), lowest.GetType());
-        EXPECT_EQ(c.highest.GetType(), highest.GetType());
+        EXPECT_EQ(Shown(c.lowest), Shown(lowest));
+        EXPECT_EQ(Shown(c.highest), Shown(highest));
         EXPECT_EQ(c.anyInside, range.IsInRange(lowest));
         EXPECT_EQ(c.anyInside, range.IsInRange(highest));
     }

@@ -1,10 +1,12 @@
-// afxcmn.h: what CTreeCtrl and CImageList add to the common controls (their one-line
-// forwards to the platform are not retested here):
-// - item texts of any length (the buffer grows), a missing item's empty text;
-// - the insertion overload that fills mask, state and data; check boxes from state images;
+// afxcmn.h: what CTreeCtrl, CListCtrl and CImageList add to the common controls (their
+// one-line forwards to the platform are not retested here; the list's rectangle parts, hit
+// tests, owner-drawn rows and the header's order array are exercised by the lists family):
+// - item texts of any length (the buffer grows), a missing item's empty text, the list's
+//   buffer form and its length;
+// - the tree's insertion overload that fills mask, state and data; check boxes from state images;
 // - image lists: permanent and temporary wrappers, Attach/Detach, DeleteImageList;
-// - the tree's image lists returned as wrappers and released when the tree goes; drag
-//   images owned by the caller.
+// - the controls' image lists returned as wrappers and let go of when the control goes (an
+//   owned list survives it); drag images owned by the caller.
 #include <afxwin.h>
 #include <afxcmn.h>
 
@@ -14,25 +16,38 @@
 
 namespace {
 
-class TreeCtrlTest : public testing::Test
+// A control in a visible pop-up parent; the test creates the control.
+template<class CTRL>
+class ControlTest : public testing::Test
 {
 protected:
     void SetUp() override
     {
-        ASSERT_TRUE(m_parent.CreateEx(0, AfxRegisterWndClass(0), _T("tree parent"), WS_POPUP | WS_VISIBLE, 40, 40,
-                                      300, 300, NULL, NULL));
-        ASSERT_TRUE(m_tree.Create(WS_CHILD | WS_VISIBLE | TVS_HASBUTTONS | TVS_LINESATROOT | TVS_EDITLABELS,
-                                  CRect(0, 0, 280, 280), &m_parent, 77));
+        ASSERT_TRUE(m_parent.CreateEx(0, AfxRegisterWndClass(0), _T("parent"), WS_POPUP | WS_VISIBLE, 40, 40,
+                                      320, 300, NULL, NULL));
     }
     void TearDown() override
     {
-        m_tree.DestroyWindow();
+        m_ctrl.DestroyWindow();
         m_parent.DestroyWindow();
+    }
+
+    CWnd m_parent;
+    CTRL m_ctrl;
+};
+
+class TreeCtrlTest : public ControlTest<CTreeCtrl>
+{
+protected:
+    void SetUp() override
+    {
+        ControlTest::SetUp();
+        ASSERT_TRUE(m_tree.Create(WS_CHILD | WS_VISIBLE | TVS_HASBUTTONS | TVS_LINESATROOT | TVS_EDITLABELS,
+                                  CRect(0, 0, 280, 280), &m_parent, 77));
     }
     std::wstring Text(HTREEITEM h) const { return std::wstring(static_cast<LPCTSTR>(m_tree.GetItemText(h))); }
 
-    CWnd m_parent;
-    CTreeCtrl m_tree;
+    CTreeCtrl& m_tree = m_ctrl;
 };
 
 TEST_F(TreeCtrlTest, ItemTextsOfAnyLengthAndTheInsertOverloadThatFillsEverything)
@@ -123,6 +138,46 @@ TEST_F(TreeCtrlTest, ImageListsAndDragImages)
     // The tree lets go of the image lists when it goes; the object keeps its own.
     m_tree.DestroyWindow();
     EXPECT_EQ(1, images.GetImageCount());
+}
+
+class ListCtrlTest : public ControlTest<CListCtrl>
+{
+protected:
+    void SetUp() override
+    {
+        ControlTest::SetUp();
+        ASSERT_TRUE(m_list.Create(WS_CHILD | WS_VISIBLE | LVS_REPORT, CRect(0, 0, 300, 200), &m_parent, 5));
+        m_list.InsertColumn(0, _T("Name"), LVCFMT_LEFT, 120);
+        m_list.InsertColumn(1, _T("Size"), LVCFMT_RIGHT, 80, 1);
+        m_list.InsertItem(0, _T("first"));
+        m_list.SetItemText(0, 1, _T("12"));
+    }
+
+    CListCtrl& m_list = m_ctrl;
+};
+
+TEST_F(ListCtrlTest, ItemTextsOfAnyLength)
+{
+    std::wstring longText(700, L'x');
+    longText += L"end";
+    ASSERT_TRUE(m_list.SetItemText(0, 1, longText.c_str()));
+    EXPECT_EQ(longText, std::wstring(static_cast<LPCTSTR>(m_list.GetItemText(0, 1))));
+    TCHAR buffer[8];
+    EXPECT_EQ(7, m_list.GetItemText(0, 1, buffer, 8));
+    EXPECT_STREQ(_T("xxxxxxx"), buffer);
+    EXPECT_STREQ(_T(""), m_list.GetItemText(5, 0));
+}
+
+TEST_F(ListCtrlTest, OwnedImageListOutlivesTheList)
+{
+    CImageList images;
+    ASSERT_TRUE(images.Create(16, 16, ILC_COLOR24, 1, 1));
+    m_list.SetImageList(&images, LVSIL_SMALL);
+    EXPECT_EQ(&images, m_list.GetImageList(LVSIL_SMALL));
+    m_list.DestroyWindow();
+    int cx = 0, cy = 0;
+    EXPECT_TRUE(::ImageList_GetIconSize(images.m_hImageList, &cx, &cy));
+    EXPECT_EQ(16, cx);
 }
 
 } // namespace
