@@ -16,6 +16,7 @@
 #include <afxcmn.h>
 #include <afxdisp.h>
 
+#include "BenchSupport.h"
 #include "KVXListCtrlEx.h"
 #include "OrvaneControls.h"
 
@@ -27,6 +28,9 @@
 #include <wchar.h>
 
 namespace {
+
+using bench::Median;
+using bench::NowMs;
 
 class CBenchApp : public CWinApp
 {
@@ -58,22 +62,6 @@ const ColumnSpec kColumns[] = {
 };
 constexpr int kColumnCount = sizeof kColumns / sizeof kColumns[0];
 const LPCTSTR kBaseTime = _T("6:00 AM");
-
-double NowMs()
-{
-    static LARGE_INTEGER frequency = {};
-    if (frequency.QuadPart == 0)
-        ::QueryPerformanceFrequency(&frequency);
-    LARGE_INTEGER counter;
-    ::QueryPerformanceCounter(&counter);
-    return static_cast<double>(counter.QuadPart) * 1000.0 / static_cast<double>(frequency.QuadPart);
-}
-
-double Median(std::vector<double> values)
-{
-    std::sort(values.begin(), values.end());
-    return values[values.size() / 2];
-}
 
 // Deterministic rows, so that every run sorts the same data.
 class RowMaker
@@ -325,15 +313,9 @@ void Measure(CWnd& parent, int rows, std::vector<Result>& results, bool& bSameOr
 
 int main()
 {
-    if (!AfxWinInit(::GetModuleHandle(NULL), NULL, ::GetCommandLine(), SW_HIDE))
-    {
-        std::printf("framework start-up failed\n");
-        return 1;
-    }
-    LoadOrvaneControlsLibrary();
-
     CWnd parent;
-    parent.CreateEx(0, AfxRegisterWndClass(0), _T("list sort bench"), WS_POPUP, 0, 0, 620, 420, NULL, NULL);
+    if (!bench::Start(parent, _T("list sort bench"), 620, 420))
+        return 1;
 
     std::vector<Result> results;
     bool bSameOrder = true;

@@ -13,6 +13,7 @@
 #include <afxwin.h>
 #include <afxcmn.h>
 
+#include "BenchSupport.h"
 #include "CMultiTree.h"
 #include "OrvaneControls.h"
 #include "TreeSelectionMath.h"
@@ -22,6 +23,9 @@
 #include <vector>
 
 namespace {
+
+using bench::Median;
+using bench::NowMs;
 
 class CBenchApp : public CWinApp
 {
@@ -39,22 +43,6 @@ public:
 
 constexpr int kRepetitions = 9;
 constexpr double kTarget = 1.2;
-
-double NowMs()
-{
-    static LARGE_INTEGER frequency = {};
-    if (frequency.QuadPart == 0)
-        ::QueryPerformanceFrequency(&frequency);
-    LARGE_INTEGER counter;
-    ::QueryPerformanceCounter(&counter);
-    return static_cast<double>(counter.QuadPart) * 1000.0 / static_cast<double>(frequency.QuadPart);
-}
-
-double Median(std::vector<double> values)
-{
-    std::sort(values.begin(), values.end());
-    return values[values.size() / 2];
-}
 
 void Fill(CBenchTree& tree, int count)
 {
@@ -138,15 +126,9 @@ Row Measure(CWnd& parent, int count)
 
 int main()
 {
-    if (!AfxWinInit(::GetModuleHandle(NULL), NULL, ::GetCommandLine(), SW_HIDE))
-    {
-        std::printf("framework start-up failed\n");
-        return 1;
-    }
-    LoadOrvaneControlsLibrary();
-
     CWnd parent;
-    parent.CreateEx(0, AfxRegisterWndClass(0), _T("tree bench"), WS_POPUP, 0, 0, 320, 420, NULL, NULL);
+    if (!bench::Start(parent, _T("tree bench"), 320, 420))
+        return 1;
 
     std::vector<Row> rows;
     for (int count : { 2000, 10000 })
