@@ -25,6 +25,14 @@
 class COleDateTimeSpan;
 
 /////////////////////////////////////////////////////////////////////////////
+// OLE initialisation of the application
+
+// Initialises OLE for this thread once; AfxWinTerm ends it again (AfxOleTerm).
+BOOL AFXAPI AfxOleInit();
+void AFXAPI AfxOleTerm(BOOL bJustRevoke = FALSE);
+void AFXAPI AfxOleTermOrFreeLib(BOOL bTerm = TRUE, BOOL bJustRevoke = FALSE);
+
+/////////////////////////////////////////////////////////////////////////////
 // COleDateTime: a point in time, with a status saying whether it holds one
 
 class COleDateTime

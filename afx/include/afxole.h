@@ -14,6 +14,7 @@
 #ifndef __AFXWIN_H__
 #include <afxwin.h>
 #endif
+#include <afxdisp.h>
 
 #include <ole2.h>
 
@@ -23,14 +24,6 @@ typedef DWORD DROPEFFECT;
 class COleDataSource;
 class COleDropSource;
 class COleDropTarget;
-
-/////////////////////////////////////////////////////////////////////////////
-// OLE initialisation of the application
-
-// Initialises OLE for this thread once; AfxWinTerm ends it again (AfxOleTerm).
-BOOL AFXAPI AfxOleInit();
-void AFXAPI AfxOleTerm(BOOL bJustRevoke = FALSE);
-void AFXAPI AfxOleTermOrFreeLib(BOOL bTerm = TRUE, BOOL bJustRevoke = FALSE);
 
 /////////////////////////////////////////////////////////////////////////////
 // COleDataObject: the receiving side of a data transfer (an IDataObject)
