@@ -1,18 +1,9 @@
 // Geometry of header drag and drop without a window.
 #include "ColumnDragGeometry.h"
 
+#include "HeaderGeometry.h"
+
 namespace ColumnDragGeometry {
-
-namespace {
-
-// Space kept around the sort arrow inside the item.
-constexpr int kArrowMargin = 3;
-// A short title puts the arrow this far inside the item's right edge.
-constexpr int kArrowRightInset = 11;
-// The arrow needs this much room before the limit: its width and two pixels.
-constexpr int kArrowRoom = 8;
-
-} // namespace
 
 int FindPressedItem(int x, const int* widths, int count)
 {
@@ -64,29 +55,11 @@ InsertionMarker MakeInsertionMarker(int x, int top, int bottom)
 
 SortArrow PlaceSortArrow(const RECT& item, int textWidth, bool rightAligned, bool ascending)
 {
-    const int left = item.left + kArrowMargin;
-    const int right = item.right - kArrowMargin;
-    const int top = item.top + kArrowMargin;
-    const int bottom = item.bottom - kArrowMargin;
-
-    SortArrow arrow = {};
-    int limit;
-    if (rightAligned)
-    {
-        // In front of the right-aligned title.
-        arrow.x = left;
-        limit = right - textWidth;
-    }
-    else
-    {
-        // Behind the title, or inset from the right edge when the title is short.
-        arrow.x = left + textWidth > right - kArrowRightInset ? left + textWidth : right - kArrowRightInset;
-        limit = right;
-    }
-    arrow.visible = arrow.x + kArrowRoom < limit;
-    arrow.apexY = ascending ? top + 2 : bottom - 3;
-    arrow.baseY = ascending ? bottom - 3 : top + 2;
-    return arrow;
+    // Placed where the extended header puts its indicator (the room it needs is this
+    // arrow's width and two pixels), but pointing the other way.
+    const HeaderGeometry::SortArrow placed =
+        HeaderGeometry::PlaceSortArrow(item, textWidth, rightAligned, !ascending);
+    return SortArrow{ placed.visible, placed.x0, placed.apexY, placed.baseY };
 }
 
 int SortColumnAfterInsert(int sortColumn, int inserted, bool sorted)
