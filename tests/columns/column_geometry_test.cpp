@@ -4,6 +4,7 @@
 // check of dropped payloads (whole records only; truncated, oversized and garbage).
 #include <gtest/gtest.h>
 
+#include "Checks.h"
 #include "ColumnDragGeometry.h"
 #include "ColumnPayload.h"
 
@@ -16,8 +17,7 @@ using namespace ColumnDragGeometry;
 
 namespace {
 
-template <typename T>
-std::string NameOf(const testing::TestParamInfo<T>& info) { return info.param.name; }
+using orvane_test::CaseName;
 
 const int kWidths[] = { 100, 15, 17, 60 };   // items at 0, 100, 115, 132; end 192
 
@@ -37,7 +37,7 @@ TEST_P(PressTest, Item)
 {
     EXPECT_EQ(GetParam().item, FindPressedItem(GetParam().x, kWidths, 4));
 }
-INSTANTIATE_TEST_SUITE_P(Cases, PressTest, testing::ValuesIn(kPressCases), NameOf<PressCase>);
+INSTANTIATE_TEST_SUITE_P(Cases, PressTest, testing::ValuesIn(kPressCases), CaseName<PressCase>);
 
 TEST(HitTestItemsTest, SpanAndClientHeight)
 {
@@ -66,7 +66,7 @@ TEST_P(InsertionTest, IndexAndLine)
     const InsertionPoint point = FindInsertionPoint(c.x, kWidths, 4, c.scroll);
     EXPECT_EQ(std::make_pair(c.index, c.lineX), std::make_pair(point.index, point.lineX));
 }
-INSTANTIATE_TEST_SUITE_P(Cases, InsertionTest, testing::ValuesIn(kInsertionCases), NameOf<InsertionCase>);
+INSTANTIATE_TEST_SUITE_P(Cases, InsertionTest, testing::ValuesIn(kInsertionCases), CaseName<InsertionCase>);
 
 TEST(InsertionTest, NoItemsIsZero)
 {
@@ -97,7 +97,7 @@ TEST_P(SortArrowTest, Placement)
     EXPECT_EQ(std::make_tuple(c.visible, c.x, c.apexY, c.baseY),
         std::make_tuple(arrow.visible, arrow.x, arrow.apexY, arrow.baseY));
 }
-INSTANTIATE_TEST_SUITE_P(Cases, SortArrowTest, testing::ValuesIn(kArrowCases), NameOf<ArrowCase>);
+INSTANTIATE_TEST_SUITE_P(Cases, SortArrowTest, testing::ValuesIn(kArrowCases), CaseName<ArrowCase>);
 
 TEST(SortColumnTest, FollowsInsertionsAndDeletions)
 {
@@ -168,6 +168,6 @@ TEST_P(PayloadTest, Verdict)
         std::make_tuple(check.verdict, check.verdict == Truncated || check.verdict == TitleTooLong ? 0
             : check.recordSize, check.hasFlag, check.flag));
 }
-INSTANTIATE_TEST_SUITE_P(Cases, PayloadTest, testing::ValuesIn(kPayloadCases), NameOf<PayloadCase>);
+INSTANTIATE_TEST_SUITE_P(Cases, PayloadTest, testing::ValuesIn(kPayloadCases), CaseName<PayloadCase>);
 
 } // namespace

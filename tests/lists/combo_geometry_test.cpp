@@ -4,7 +4,7 @@
 #include <gtest/gtest.h>
 
 #include "ComboListGeometry.h"
-#include "ListsTestSupport.h"
+#include "Checks.h"
 
 #include <commctrl.h>
 
@@ -15,7 +15,7 @@ using namespace ComboListGeometry;
 
 namespace {
 
-using lists_test::Str;
+using orvane_test::Str;
 
 // Rows 17 high from y 40; three columns; edges of 2, a minimum width of 21.
 struct ComboRectCase { const char* name; int rowLeft; int secondWidth; int column; int imageWidth; RECT expected; int widenedTo; };
@@ -43,7 +43,7 @@ TEST_P(ComboRectTest, Rectangle)
     EXPECT_EQ(c.widenedTo, combo.widen ? combo.widenedWidth : 0);
 }
 
-INSTANTIATE_TEST_SUITE_P(Cells, ComboRectTest, testing::ValuesIn(kComboRectCases), lists_test::CaseName<ComboRectCase>);
+INSTANTIATE_TEST_SUITE_P(Cells, ComboRectTest, testing::ValuesIn(kComboRectCases), orvane_test::CaseName<ComboRectCase>);
 
 TEST(ComboListGeometryTest, WindowsAndRowsInView)
 {

@@ -11,7 +11,7 @@
 #include "Input.h"
 #include "KVXComboBoxListCtrlEx.h"
 #include "KVXSimpleListControlExItemCommand.h"
-#include "ListsTestSupport.h"
+#include "Checks.h"
 #include "MsgSequence.h"
 
 #include <string>
@@ -20,7 +20,7 @@
 namespace {
 
 using namespace orvane_test;
-using lists_test::Narrow;
+using orvane_test::Narrow;
 
 const UINT kListId = 7;
 const int kComboBase = 5106;
@@ -344,7 +344,7 @@ TEST_F(ComboListTest, ListsDestroyedWithOpenBoxesLeaveNothing)
         }
     };
     // A box left behind would leave several heap blocks per cycle.
-    lists_test::ExpectNoLeaks(cycles, 3, 10, 10);
+    orvane_test::ExpectNoLeaks(cycles, 3, 10, 10);
 }
 
 } // namespace

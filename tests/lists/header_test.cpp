@@ -10,7 +10,7 @@
 #include "HeaderGeometry.h"
 #include "Input.h"
 #include "KVXHeaderCtrlEx.h"
-#include "ListsTestSupport.h"
+#include "Checks.h"
 #include "Pixels.h"
 
 #include <memory>
@@ -51,7 +51,7 @@ TEST_P(SortArrowTest, Placement)
         testing::PrintToString(std::make_tuple(arrow.visible, arrow.x0, arrow.apexX, arrow.apexY, arrow.baseY)));
 }
 
-INSTANTIATE_TEST_SUITE_P(Cases, SortArrowTest, testing::ValuesIn(kArrowCases), lists_test::CaseName<ArrowCase>);
+INSTANTIATE_TEST_SUITE_P(Cases, SortArrowTest, testing::ValuesIn(kArrowCases), orvane_test::CaseName<ArrowCase>);
 
 TEST(DropPositionTest, ItemUnderThePointerOrTheEnd)
 {
@@ -199,7 +199,7 @@ TEST_P(SortIndicatorPaintTest, Pixels)
     EXPECT_NE(sorted.At(arrow.apexX, arrow.apexY), unsorted.At(arrow.apexX, arrow.apexY));
 }
 
-INSTANTIATE_TEST_SUITE_P(Cases, SortIndicatorPaintTest, testing::ValuesIn(kPaintCases), lists_test::CaseName<PaintCase>);
+INSTANTIATE_TEST_SUITE_P(Cases, SortIndicatorPaintTest, testing::ValuesIn(kPaintCases), orvane_test::CaseName<PaintCase>);
 
 // ---------------------------------------------------------------------------------
 // Column dragging. Steps: dN press on item N, mN move there with the button held,
@@ -246,6 +246,6 @@ TEST_P(ColumnDragTest, Callbacks)
     EXPECT_EQ(nullptr, ::GetCapture());
 }
 
-INSTANTIATE_TEST_SUITE_P(Cases, ColumnDragTest, testing::ValuesIn(kDragCases), lists_test::CaseName<DragCase>);
+INSTANTIATE_TEST_SUITE_P(Cases, ColumnDragTest, testing::ValuesIn(kDragCases), orvane_test::CaseName<DragCase>);
 
 } // namespace

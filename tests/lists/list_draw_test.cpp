@@ -9,7 +9,7 @@
 
 #include "Input.h"
 #include "KVXListCtrlEx.h"
-#include "ListsTestSupport.h"
+#include "Checks.h"
 #include "Pixels.h"
 
 #include <string>
@@ -19,7 +19,7 @@
 namespace {
 
 using namespace orvane_test;
-using lists_test::Narrow;
+using orvane_test::Narrow;
 
 // The list's parent: a framework window, so that WM_DRAWITEM is reflected to the list, and
 // the target of the abbreviate callback.
@@ -446,7 +446,7 @@ TEST_F(ListDrawTest, PaintedListsLeaveNothingBehind)
             CGdiObject::DeleteTempMap();
         }
     };
-    lists_test::ExpectNoLeaks(cycles, 5, 25, 10);
+    orvane_test::ExpectNoLeaks(cycles, 5, 25, 10);
 }
 
 } // namespace

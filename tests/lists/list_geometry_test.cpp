@@ -5,7 +5,7 @@
 #include <gtest/gtest.h>
 
 #include "ListGeometry.h"
-#include "ListsTestSupport.h"
+#include "Checks.h"
 
 #include <commctrl.h>
 
@@ -16,8 +16,8 @@ using namespace ListGeometry;
 
 namespace {
 
-using lists_test::CaseName;
-using lists_test::Str;
+using orvane_test::CaseName;
+using orvane_test::Str;
 
 // Row from 0 to boundsRight, label (34, 20, 100, 37), offset 6, client right 400.
 struct HighlightCase { const char* name; int type; int boundsRight; int textWidth; RECT expected; };

@@ -10,7 +10,7 @@
 
 #include "Input.h"
 #include "KVXListCtrlEx.h"
-#include "ListsTestSupport.h"
+#include "Checks.h"
 #include "MsgSequence.h"
 
 #include <commctrl.h>
@@ -132,7 +132,7 @@ protected:
             TCHAR title[16] = {};
             LVCOLUMN column = { LVCF_TEXT, 0, 0, title, 16 };
             m_list.GetColumn(c, &column);
-            texts += (c > 0 ? "|" : "") + lists_test::Narrow(row < 0 ? title : static_cast<LPCTSTR>(m_list.GetItemText(row, c)));
+            texts += (c > 0 ? "|" : "") + orvane_test::Narrow(row < 0 ? title : static_cast<LPCTSTR>(m_list.GetItemText(row, c)));
         }
         return texts;
     }
@@ -185,7 +185,7 @@ TEST_P(SortListTest, RowsAndItemData)
     EXPECT_EQ(std::to_string(c.column) + (c.ascending ? " asc" : " desc"), SortInfo());
 }
 
-INSTANTIATE_TEST_SUITE_P(Columns, SortListTest, testing::ValuesIn(kSortCases), lists_test::CaseName<SortCase>);
+INSTANTIATE_TEST_SUITE_P(Columns, SortListTest, testing::ValuesIn(kSortCases), orvane_test::CaseName<SortCase>);
 
 // Steps: SortList(column, ascending), or ResortList for column -2; then the trace, the rows
 // and the sort state. Before the second step a row "d" sorting first by size is added.

@@ -7,7 +7,7 @@
 #include <gtest/gtest.h>
 
 #include "ListSortKeys.h"
-#include "ListsTestSupport.h"
+#include "Checks.h"
 
 #include <vector>
 
@@ -64,6 +64,6 @@ TEST_P(SortOrderTest, RowsInOrder)
     EXPECT_EQ(c.expected, SortKeys(c.type, c.texts, baseTime).Order(c.ascending));
 }
 
-INSTANTIATE_TEST_SUITE_P(Rules, SortOrderTest, testing::ValuesIn(kOrderCases), lists_test::CaseName<OrderCase>);
+INSTANTIATE_TEST_SUITE_P(Rules, SortOrderTest, testing::ValuesIn(kOrderCases), orvane_test::CaseName<OrderCase>);
 
 } // namespace

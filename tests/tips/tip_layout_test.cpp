@@ -10,6 +10,7 @@
 #include <string>
 #include <vector>
 
+#include "Checks.h"
 #include "TipLayout.h"
 
 namespace {
@@ -47,10 +48,8 @@ std::wstring Joined(const std::wstring& text, bool ok, const std::vector<Line>& 
     return out;
 }
 
-std::string Str(const RECT& r) { return testing::PrintToString(std::vector<LONG>{ r.left, r.top, r.right, r.bottom }); }
-
-template <class Case>
-std::string CaseName(const testing::TestParamInfo<Case>& info) { return info.param.name; }
+using orvane_test::CaseName;
+using orvane_test::Str;
 
 struct WrapCase { const char* name; const wchar_t* text; int maxWidth, maxHeight; const wchar_t* lines; int queries; };
 

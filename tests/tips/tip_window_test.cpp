@@ -10,6 +10,7 @@
 #include <utility>
 #include <vector>
 
+#include "Checks.h"
 #include "Input.h"
 #include "KVXTitleTipCtrl.h"
 #include "KVXToolTipCtrl.h"
@@ -41,7 +42,6 @@ END_MESSAGE_MAP()
 const wchar_t kText[] = L"The whole text of a label that is cut off";
 enum { kOwnerStream = 1, kNeighbourStream = 2 };
 
-std::string Str(const RECT& r) { return testing::PrintToString(std::vector<LONG>{ r.left, r.top, r.right, r.bottom }); }
 
 class TipWindowTest : public testing::Test
 {
@@ -292,24 +292,7 @@ TEST_F(TipWindowTest, ShowingAndHidingManyTimesLeavesNothingBehind)
             PumpUntilIdle(20);
         }
     };
-    // Live GDI objects (every 16-bit handle index the system resolves) and top-level windows.
-    auto count = [] {
-        std::pair<int, int> n(0, 0);
-        for (UINT_PTR i = 1; i <= 0xFFFF; ++i)
-            n.first += ::GetObjectType(reinterpret_cast<HGDIOBJ>(i)) != 0;
-        ::EnumThreadWindows(::GetCurrentThreadId(), [](HWND, LPARAM p) -> BOOL { return ++*reinterpret_cast<int*>(p); },
-                            reinterpret_cast<LPARAM>(&n.second));
-        return n;
-    };
-    cycles(10);
-    const auto before = count();
-    cycles(50);
-    const auto half = count();
-    cycles(50);
-    const auto after = count();
-    EXPECT_FALSE(half.first > before.first && after.first > half.first)
-        << "GDI objects " << before.first << " " << half.first << " " << after.first;
-    EXPECT_EQ(before.second, after.second) << "windows";
+    ExpectNoLeaks(cycles, 10, 50, 0);
 }
 
 } // namespace

@@ -1,5 +1,4 @@
-// Shared by the list family's tests: printable rectangles and texts, case names, and the
-// leak measure (live GDI objects, the thread's windows with their children, heap blocks).
+// Printable rectangles and texts, names of table cases, and the leak measure (live GDI objects, the thread's windows with their children, heap blocks).
 #pragma once
 
 #include <windows.h>
@@ -11,7 +10,7 @@
 #include <string>
 #include <vector>
 
-namespace lists_test {
+namespace orvane_test {
 
 inline std::string Str(const RECT& r) { return testing::PrintToString(std::vector<LONG>{ r.left, r.top, r.right, r.bottom }); }
 
@@ -55,4 +54,4 @@ inline void ExpectNoLeaks(const std::function<void(int)>& cycles, int warmUp, in
         << "heap blocks " << before[2] << " " << middle[2] << " " << after[2];
 }
 
-} // namespace lists_test
+} // namespace orvane_test
